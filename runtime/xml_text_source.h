@@ -1,0 +1,82 @@
+#pragma once
+
+#include <string>
+
+#include "platform/api.h"
+#include "runtime/entities.h"
+#include "runtime/white_space.h"
+
+namespace qbxV2 {
+
+/// A getter that knows the small constructs of XML: white space, quoted values, comments, processing
+/// instructions, the XML declaration, character references, and how character data is stored.
+class VRL_API c_get_for_xml : public c_get_with_entities {
+public:
+    /// `ws_for_char_refs` tells whether white-space handling also applies to characters written as
+    /// references.
+    c_get_for_xml(c_read& source, c_error& errors, bool ws_for_char_refs)
+        : c_get_with_entities(source, errors), m_ws_for_char_refs(ws_for_char_refs) {}
+
+    /// The next value that is no white space; -1 at the end.
+    int get_non_ws();
+    /// Reads and compares. On a mismatch false, with the character at fault consumed.
+    bool read_specified_string_from_input(const char* s);
+    /// Skips white space and reads a value in single or double quotes. False without a quote, or at the end
+    /// of input.
+    bool get_simple_quoted_value(std::string* value);
+    /// From behind "<!--" to the end of the comment. More than two "-" before its ">" are a warning,
+    /// EQBX_BAD_COMMENT; a "--" inside passes. False at the end of input.
+    bool skip_comment();
+    /// From anywhere in a processing instruction to behind its "?>". False at the end of input.
+    bool skip_PI();
+    /// From within a start tag to behind its ">". `*is_empty` tells whether it ended in "/>"; it may be null.
+    /// Anything but white space between "/" and ">" is a report, EQBX_BAD_END_TAG, and false. False at the
+    /// end of input, but true when it comes behind the "/".
+    bool move_to_start_tag_end(bool* is_empty);
+    /// The body of a CDATA section from behind "<![": appends its text. False when "CDATA[" does not follow.
+    /// The end of input ends the section.
+    bool get_cdata(std::string* text);
+
+    /// Appends a character by the white-space mode in force.
+    void add_char_wsp(std::string* s, int c, bool from_char_ref);
+    /// Appends what can be had at once of character data up to "<", by the mode in force. It may append
+    /// nothing; the rest comes through `get`. "&" stops it too, unless it is to be plain text.
+    void add_text_run(std::string* s, bool stop_at_ampersand);
+    /// Reads a character reference from behind its "#". Up to U+100000. False for a bad one.
+    bool insert_character_entity(c_entity_name_reader& reader, std::string* out);
+
+    void set_ws_mode(eqbx_whitespace mode) {
+        m_ws_mode = mode;
+        m_pending_space = false;
+    }
+    void reset_ws_mode() { m_pending_space = false; }
+
+    /// The rest of an XML declaration from behind "<?xml". False after a report of EQBX_BAD_XML_DECL,
+    /// EQBX_BAD_XML_VERSION or EQBX_ENCODING_MISMATCH, EQBX_BAD_CHAR_ENCODING, and for bad syntax without
+    /// one.
+    bool read_xml_decl();
+    /// Back to the start; white space is preserved again.
+    void rewind();
+
+    /// Reads the rest of a name, and the value behind it, which is the result.
+    int get_rest_of_name(std::string* name);
+    /// Reads up to `quote` and consumes it. False at the end of input.
+    bool get_up_to_quote(int quote, std::string* value);
+    /// Reads `</name`, white space and `>`, after optional white space. False, with input consumed, for
+    /// anything else.
+    bool read_end_tag(const std::string& name);
+
+private:
+    bool read_version();
+    bool read_encoding(int* c);
+    bool read_standalone(int* c);
+    bool read_equals_and_value(int* c, bool* has_value, std::string* value);
+    void collapse_run(std::string* s, const unsigned char* from, const unsigned char* to);
+
+    std::string m_digits;
+    eqbx_whitespace m_ws_mode = EQBX_WS_PRESERVE;
+    bool m_pending_space = false;
+    bool m_ws_for_char_refs;
+};
+
+}  // namespace qbxV2
