@@ -26,7 +26,7 @@ dom parse(const std::string& module) {
 
 std::string attribute(const xmlNode* node, const char* name) {
     xmlChar* value = xmlGetNoNsProp(node, reinterpret_cast<const xmlChar*>(name));
-    const std::string text = value == nullptr ? "" : reinterpret_cast<const char*>(value);
+    std::string text = value == nullptr ? "" : reinterpret_cast<const char*>(value);
     xmlFree(value);
     return text;
 }
