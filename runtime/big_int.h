@@ -19,7 +19,6 @@ class VRL_API c_big_int {
 public:
     c_big_int();
     c_big_int(const c_big_int& other) = default;
-    c_big_int(c_big_int&& other) noexcept = default;
     c_big_int(const std::string& text);
     c_big_int(long value);
     c_big_int(const char* text);
@@ -29,7 +28,6 @@ public:
     ~c_big_int() = default;
 
     c_big_int& operator=(const c_big_int& other) = default;
-    c_big_int& operator=(c_big_int&& other) noexcept = default;
     c_big_int& operator=(const std::string& text);
     c_big_int& operator=(long value);
     c_big_int& operator=(const char* text);

@@ -23,7 +23,6 @@ public:
 
     c_decimal() = default;
     c_decimal(const c_decimal& other) = default;
-    c_decimal(c_decimal&& other) noexcept = default;
     c_decimal(const std::string& text);
     c_decimal(const char* text);
     /// `value` times ten to the power of minus `scale`; the fraction has `scale` digits. A negative scale
@@ -39,7 +38,6 @@ public:
     ~c_decimal() = default;
 
     c_decimal& operator=(const c_decimal& other) = default;
-    c_decimal& operator=(c_decimal&& other) noexcept = default;
     c_decimal& operator=(const std::string& text);
     c_decimal& operator=(const char* text);
     /// With 15 digits behind the point.

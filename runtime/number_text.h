@@ -3,14 +3,11 @@
 #include <cstddef>
 #include <string>
 
-#include "platform/api.h"
+#include "runtime/text_conversions.h"  // float_zero
 
 namespace qbxV2 {
 
-/// 0.0. A function of the library, so that dividing by it happens at run time.
-VRL_API double float_zero();
-
-/// Of this header only `float_zero` leaves the library.
+/// For the rooms of the library; nothing of this header is exported.
 
 /// Text to numbers, as the reader does it once a check of "text_checks.h" has passed. Nothing is refused: a
 /// text that is no number gives what its beginning gives, or zero. The decimal mark is a point, whatever the

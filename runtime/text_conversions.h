@@ -7,6 +7,9 @@
 
 namespace qbxV2 {
 
+/// 0.0. A function of the library, so that dividing by it happens at run time.
+VRL_API double float_zero();
+
 /// Between narrow text (UTF-8) and wide text (one element a UTF-16 unit, on every system).
 ///
 /// Errors   never reported: a bad text yields what could be converted.

@@ -1,0 +1,155 @@
+#include "runtime/text_conversions.h"
+
+#include <cstdint>
+
+#include "runtime/utf16_units.h"
+
+namespace qbxV2 {
+
+using detail::append_utf8;
+using detail::from_surrogates;
+using detail::is_high_surrogate;
+using detail::is_low_surrogate;
+
+namespace {
+
+/// Converts from the element at `at` on, appending to `out`.
+void append_utf8_from(std::string& out, const std::wstring& in, std::size_t at) {
+    while (at < in.size()) {
+        auto code = static_cast<std::uint32_t>(in[at++]);
+        if (is_high_surrogate(code) && at < in.size()) {
+            // Intended: the element behind a high surrogate is used up even when it is no low surrogate.
+            const auto next = static_cast<std::uint32_t>(in[at++]);
+            if (is_low_surrogate(next)) code = from_surrogates(code, next);
+        }
+        // Intended: an element of 0 vanishes.
+        if (code != 0) append_utf8(out, code);
+    }
+}
+
+/// Bytes of the sequence that begins with `lead`, 0 if none does, and the payload bits of `lead`.
+std::size_t sequence_length(std::uint32_t lead, std::uint32_t& payload) {
+    payload = lead;
+    if (lead < 0x80) return 1;
+    payload = lead & 0x1F;
+    if ((lead & 0xE0) == 0xC0) return 2;
+    payload = lead & 0x0F;
+    if ((lead & 0xF0) == 0xE0) return 3;
+    payload = lead & 0x07;
+    if ((lead & 0xF8) == 0xF0) return 4;
+    return 0;
+}
+
+/// Reads the sequence at `at` into `code` and returns its length; 0 when there is none or it is broken.
+std::size_t read_sequence(const char* in, std::size_t size, std::size_t at, std::uint32_t& code) {
+    const std::size_t count = sequence_length(static_cast<unsigned char>(in[at]), code);
+    if (count == 0 || count > size - at) return 0;
+    for (std::size_t i = 1; i < count; ++i) {
+        const auto byte = static_cast<unsigned char>(in[at + i]);
+        if ((byte & 0xC0) != 0x80) return 0;
+        code = (code << 6) | (byte & 0x3FU);
+    }
+    return count;
+}
+
+/// Converts from the byte at `at` on into `units`, which has room for as many units as there are bytes.
+/// Returns the number of units.
+std::size_t put_units_from(wchar_t* units, const char* in, std::size_t size, std::size_t at) {
+    wchar_t* const start = units;
+    std::uint32_t pending = 0;
+    while (at < size) {
+        std::uint32_t code = 0;
+        const std::size_t count = read_sequence(in, size, at, code);
+        if (count == 0) break;
+        at += count;
+        if (pending != 0) {
+            if (!is_low_surrogate(code)) break;
+            *units++ = static_cast<wchar_t>(pending);
+            *units++ = static_cast<wchar_t>(code);
+            pending = 0;
+        } else if (is_high_surrogate(code)) {
+            pending = code;
+        } else if (code > 0xFFFF) {
+            *units++ = static_cast<wchar_t>(0xD800 + ((code - 0x10000) >> 10));
+            *units++ = static_cast<wchar_t>(0xDC00 + (code & 0x3FF));
+        } else {
+            *units++ = static_cast<wchar_t>(code);
+        }
+    }
+    return static_cast<std::size_t>(units - start);
+}
+
+}  // namespace
+
+double float_zero() { return 0.0; }
+
+std::string& convert(std::string* out, const std::wstring& in) {
+    // Most texts are ASCII: narrow everything, and do it again from the first element that was none.
+    out->resize(in.size());
+    char* const bytes = out->data();
+    std::size_t plain = 0;
+    for (; plain < in.size(); ++plain) {
+        const auto code = static_cast<std::uint32_t>(in[plain]);
+        if (code - 1 >= 0x7F) break;
+        bytes[plain] = static_cast<char>(code);
+    }
+    out->resize(plain);
+    append_utf8_from(*out, in, plain);
+    return *out;
+}
+
+std::wstring& convert(std::wstring* out, const std::string& in) { return vtostring(*out, in); }
+
+std::wstring& vtostring(std::wstring& out, const std::string& in) {
+    return vtostring(out, in.data(), in.size());
+}
+
+std::wstring& vtostring(std::wstring& out, const char* in, std::size_t size) {
+    out.resize(size);
+    wchar_t* const units = out.data();
+    // Most texts are ASCII: widen everything in one loop without a way out, which compilers turn into vector
+    // code, and look afterwards whether that was right.
+    unsigned char all = 0;
+    for (std::size_t i = 0; i < size; ++i) {
+        const auto byte = static_cast<unsigned char>(in[i]);
+        all |= byte;
+        units[i] = static_cast<wchar_t>(byte);
+    }
+    if (all < 0x80) return out;
+    std::size_t plain = 0;
+    while (static_cast<unsigned char>(in[plain]) < 0x80) ++plain;
+    out.resize(plain + put_units_from(units + plain, in, size, plain));
+    return out;
+}
+
+std::string& vtostring(std::string& out, const std::string& in) {
+    // Intended: cleared first, so that a string converted into itself ends up empty.
+    out.clear();
+    out.append(in);
+    return out;
+}
+
+void make_qname(std::string* out, const std::string& qualified, const std::string& /*uri*/,
+                const std::string& /*local_part*/) {
+    *out = qualified;
+}
+
+void make_qname(std::wstring* out, const std::string& qualified, const std::string& /*uri*/,
+                const std::string& /*local_part*/) {
+    vtostring(*out, qualified);
+}
+
+void make_qname(ct_qname<std::string>* out, const std::string& /*qualified*/, const std::string& uri,
+                const std::string& local_part) {
+    out->set_namespace(uri);
+    out->set_local_part(local_part);
+}
+
+void make_qname(ct_qname<std::wstring>* out, const std::string& /*qualified*/, const std::string& uri,
+                const std::string& local_part) {
+    out->set_namespace(uri);
+    std::wstring wide;
+    out->set_local_part(vtostring(wide, local_part));
+}
+
+}  // namespace qbxV2
