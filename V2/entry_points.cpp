@@ -1,0 +1,79 @@
+#include <memory>
+#include <sstream>
+
+#include "V2/Vrl.h"
+#include "platform/file_open.h"
+#include "platform/text_stream.h"
+#include "runtime/xml_reader.h"
+#include "runtime/xml_writer.h"
+
+namespace vrl_v2 {
+namespace {
+
+using qbxV2::eqbx_error;
+
+constexpr wchar_t k_packed_suffix[] = L".vrlz";
+constexpr wchar_t k_plain_suffix[] = L".vrl";
+
+// Two of the codes that are left to callers have a meaning here.
+constexpr eqbx_error k_packed_failed = qbxV2::EQBX_USER_ERROR_1;
+constexpr eqbx_error k_unknown_suffix = qbxV2::EQBX_USER_ERROR_2;
+
+/// Exact: case counts, and nothing else of the path is looked at.
+bool ends_in(const std::wstring& path, const std::wstring& suffix) {
+    return path.size() >= suffix.size() &&
+           path.compare(path.size() - suffix.size(), suffix.size(), suffix) == 0;
+}
+
+/// The name under which this library reads and writes.
+SDKType this_library() {
+    SDKType library;
+    library.set_SDKName(L"Vrl2-QBX-3.7.6");
+    library.get_SDKVersion().set_SDKVersion(L"1.0");
+    return library;
+}
+
+/// Stamps the document, const or not, and writes it.
+eqbx_error write_text(Vrl const& document, std::ostream& os) {
+    const_cast<Vrl&>(document).get_Preamble().get_Header().assign_WriteSDKInformation(this_library());
+    qbxV2::c_xml_writer out(os, qbxV2::c_xml_writer::include_xml_decl, "\t", "\n");
+    return document.marshal(out, "Vrl:Vrl");
+}
+
+}  // namespace
+
+// Intended: going through the mutable getters makes Preamble and Header present from birth.
+void Vrl::init() { get_Preamble().get_Header().assign_ReadSDKInformation(this_library()); }
+
+eqbx_error Vrl::loadFile(std::wstring const& path) {
+    if (ends_in(path, k_packed_suffix)) return k_packed_failed;
+    qbxV2::c_xml_reader_file reader(path.c_str());
+    return reader.is_open() ? unmarshal(reader) : qbxV2::EQBX_FILE_NOT_OPENED;
+}
+
+eqbx_error Vrl::loadString(std::wstring const& xml) {
+    std::string utf8;
+    qbxV2::convert(&utf8, xml);
+    qbxV2::c_xml_reader_memory reader(utf8.data(), utf8.size());
+    return unmarshal(reader);
+}
+
+eqbx_error Vrl::writeFile(std::wstring const& path) const {
+    if (ends_in(path, k_packed_suffix)) return k_packed_failed;
+    if (!ends_in(path, k_plain_suffix)) return k_unknown_suffix;
+    // Intended: a file that cannot be opened is not reported; the text goes nowhere.
+    const std::unique_ptr<std::ostream> file = vrl_platform::create_crlf_file(path);
+    const eqbx_error result = write_text(*this, *file);
+    if (result != qbxV2::EQBX_NO_ERROR) vrl_platform::remove_file(path);
+    return result;
+}
+
+XMLDocumentResult Vrl::writeString() const {
+    std::ostringstream os;
+    const eqbx_error result = write_text(*this, os);
+    std::wstring document;
+    if (result == qbxV2::EQBX_NO_ERROR) qbxV2::convert(&document, os.str());
+    return {document, result};
+}
+
+}  // namespace vrl_v2

@@ -1,0 +1,53 @@
+#include <exception>
+#include <filesystem>
+#include <fstream>
+#include <iostream>
+#include <sstream>
+
+#include "codegen/class_plan.h"
+#include "codegen/emit.h"
+#include "codegen/schema_reader.h"
+
+namespace {
+
+/// Leaves a file alone that already says the same: what didn't change isn't built again.
+void write_if_changed(const std::filesystem::path& path, const std::string& text) {
+    std::ifstream old(path, std::ios::binary);
+    std::ostringstream present;
+    present << old.rdbuf();
+    if (old.is_open() && present.str() == text) return;
+    std::filesystem::create_directories(path.parent_path());
+    std::ofstream(path, std::ios::binary) << text;
+}
+
+void generate(const std::string& schema_path, const std::filesystem::path& out) {
+    using namespace vrl_codegen;
+    const schema source = read_schema(schema_path);
+    const plan model = make_plan(source);
+    const std::filesystem::path v2 = out / "V2";
+    write_if_changed(v2 / "forward.h", emit_forward(model));
+    write_if_changed(v2 / "tokens.h", emit_tokens(model));
+    write_if_changed(v2 / "format.h", emit_format(model));
+    write_if_changed(v2 / "Vrl.h", emit_chief_header(model));
+    for (const module_plan& module : model.modules) {
+        write_if_changed(v2 / (module.name + ".h"), emit_module_header(module));
+        write_if_changed(v2 / (module.name + ".cpp"), emit_module_source(model, module));
+    }
+}
+
+}  // namespace
+
+int main(int argc, char** argv) {
+    if (argc != 3) {
+        std::cerr << "usage: vrl_codegen SCHEMA OUTPUT_FOLDER\n"
+                     "Compiles the document schema into the C++ classes of the model.\n";
+        return 2;
+    }
+    try {
+        generate(argv[1], argv[2]);
+    } catch (const std::exception& failure) {
+        std::cerr << "vrl_codegen: " << failure.what() << '\n';
+        return 1;
+    }
+    return 0;
+}
