@@ -46,7 +46,7 @@ private:
     bool read_entity_declaration();
     bool read_entity_definition();
     bool read_external_definition(c_dtd_util& util, std::string* keyword);
-    bool skip_declaration();
+    void skip_declaration();
     bool refuse(const char* text, int c);
 
     c_get_for_xml& m_getter;

@@ -3,6 +3,7 @@
 #include <cstddef>
 #include <memory>
 #include <string>
+#include <unordered_set>
 #include <vector>
 
 #include "platform/api.h"
@@ -68,11 +69,11 @@ private:
 
     int get_with_entities();
     void define(entity_table* table, const char* name, const char* value);
-    bool is_open(const char* value) const;
-    void keep_text_of_open_entities();
-    void frames_changed();
+    void keep_text(s_frame* frame);
+    void close_frame();
 
     std::vector<s_frame> m_frames;
+    std::unordered_set<const char*> m_open;
     entity_table m_general;
     entity_table m_parameter;
     std::vector<std::unique_ptr<char[]>> m_kept_texts;

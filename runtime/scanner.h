@@ -12,8 +12,6 @@
 
 namespace qbxV2 {
 
-class c_string_stack;
-
 /// A pull scanner for XML: one event a call, no tree, no validation against a DTD.
 ///
 /// Order of calls. After EQXP_NAME from `get_element_name` the caller reads the attributes
@@ -102,16 +100,17 @@ private:
 
     eqxp_xml_event deliver(eqxp_xml_event event);
     eqxp_xml_event fail_not_well_formed(const char* message);
-    eqxp_xml_event get_start_tag(int first, c_xml_local* scope, std::string* name);
-    eqxp_xml_event get_end_tag(std::string* name);
-    step get_reference_text(std::string* name, eqxp_xml_event* event);
+    step get_tag_or_markup(c_xml_local* scope, std::string* name, eqxp_xml_event* event);
+    step get_start_tag(int first, c_xml_local* scope, std::string* name, eqxp_xml_event* event);
+    step get_end_tag(std::string* name, eqxp_xml_event* event);
     step get_instruction();
     step get_markup(std::string* name, eqxp_xml_event* event);
-    step get_cdata_text(std::string* name, eqxp_xml_event* event);
-    step get_doctype(eqxp_xml_event* event);
+    step get_doctype();
+    step get_text(int c, std::string* text, eqxp_xml_event* event);
     bool get_rest_of_text(std::string* text);
 
     bool get_attributes(c_xml_local* scope);
+    bool get_declaration(c_xml_local* scope, std::size_t at);
     bool get_raw_value(std::string* bytes);
     bool declare_namespace(c_xml_local* scope, const char* name, const char* value);
     bool expand_declared_uri(const char* value);
@@ -121,13 +120,13 @@ private:
     piece get_nested_piece(std::string* text);
     piece get_nested_markup(std::string* text);
     piece get_nested_declaration(std::string* text);
-    piece get_nested_tag(int first, std::string* name);
+    int get_nested_name(int c, std::string* name);
     bool copy_start_tag(const std::string& name, std::string* out, bool* is_empty);
     void copy_attributes(c_attribute_buffer* buffer, std::string* out);
     bool copy_element(const std::string& name, std::string* out);
-    bool copy_body(c_string_stack* open, std::string* out);
 
     bool expand_reference(c_entity_name_reader& reader, std::string* out);
+    bool resolve_reference(c_entity_name_reader& reader, std::string* out, const char** value);
     bool expand_inline(const char* value, std::string* out);
 
     c_get_for_xml m_getter;

@@ -129,16 +129,15 @@ private:
     bool step_back(int c);
     int read_byte();
     int get_unit();
-    int get_utf16_unit();
+    int get_wide_unit(int first);
+    int join_16_bits(int first, bool big_endian);
     int get_multi_byte(int first);
     void read_multi_byte(int first);
     int get_encoded(int code_point);
     int detect_encoding(int b0);
     int detect_from_byte_order_mark(int b0);
-    int detect_from_first_character(int b0);
     int refuse_encoding();
     bool refuse_mismatch();
-    int read_16_bits(bool big_endian);
     void set_mode(eqxp_encoding encoding);
     void set_pending(const unsigned char* pending);
 

@@ -39,6 +39,8 @@ public:
 
     /// Appends a character by the white-space mode in force.
     void add_char_wsp(std::string* s, int c, bool from_char_ref);
+    /// The same for [from, to), none of it from references.
+    void add_chars_wsp(std::string* s, const char* from, const char* to);
     /// Appends what can be had at once of character data up to "<", by the mode in force. It may append
     /// nothing; the rest comes through `get`. "&" stops it too, unless it is to be plain text.
     void add_text_run(std::string* s, bool stop_at_ampersand);
@@ -67,13 +69,16 @@ public:
     bool read_end_tag(const std::string& name);
 
 private:
+    enum class pseudo_value { none, read, bad };
+
     bool read_version();
+    bool refuse_version();
     bool read_encoding(int* c);
     bool read_standalone(int* c);
-    bool read_equals_and_value(int* c, bool* has_value, std::string* value);
-    void collapse_run(std::string* s, const unsigned char* from, const unsigned char* to);
+    pseudo_value read_pseudo_value(int* c, const char* rest_of_name, std::string* value);
+    void add_run(std::string* s, unsigned char stop);
+    void collapse(std::string* s, const char* from, const char* to);
 
-    std::string m_digits;
     eqbx_whitespace m_ws_mode = EQBX_WS_PRESERVE;
     bool m_pending_space = false;
     bool m_ws_for_char_refs;

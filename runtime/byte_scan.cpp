@@ -1,0 +1,68 @@
+#include "runtime/byte_scan.h"
+
+namespace qbxV2::detail {
+namespace {
+
+bool is_continuation(unsigned char c) { return (c & 0xC0U) == 0x80; }
+
+bool is_plain_two(const unsigned char* p) { return is_continuation(p[1]) && !(p[0] == 0xC2 && p[1] == 0x85); }
+
+bool is_plain_three(const unsigned char* p) {
+    if (!is_continuation(p[1]) || !is_continuation(p[2])) return false;
+    if (p[0] == 0xE0 && p[1] < 0xA0) return false;
+    if (p[0] == 0xED && p[1] > 0x9F) return false;
+    return !(p[0] == 0xE2 && p[1] == 0x80 && p[2] == 0xA8);
+}
+
+bool is_plain_four(const unsigned char* p) {
+    if (!is_continuation(p[1]) || !is_continuation(p[2]) || !is_continuation(p[3])) return false;
+    if (p[0] == 0xF0 && p[1] < 0x90) return false;
+    return !(p[0] == 0xF4 && p[1] > 0x8F);
+}
+
+}  // namespace
+
+std::size_t plain_utf8_length(const unsigned char* p, const unsigned char* end) {
+    const auto left = static_cast<std::size_t>(end - p);
+    if (p[0] < 0xC2 || p[0] > 0xF4) return 0;
+    if (p[0] < 0xE0) return left >= 2 && is_plain_two(p) ? 2 : 0;
+    if (p[0] < 0xF0) return left >= 3 && is_plain_three(p) ? 3 : 0;
+    return left >= 4 && is_plain_four(p) ? 4 : 0;
+}
+
+s_scan scan_text(const unsigned char* p, const unsigned char* end, unsigned mask, unsigned char also,
+                 bool utf8) {
+    unsigned line_feeds = 0;
+    for (;;) {
+        while (p != end && byte_is(*p, mask)) ++p;
+        if (p == end) break;
+        if (*p == '\n') {
+            ++line_feeds;
+            ++p;
+        } else if (*p == also) {
+            ++p;
+        } else {
+            const std::size_t length = utf8 && *p >= 0x80 ? plain_utf8_length(p, end) : 0;
+            if (length == 0) break;
+            p += length;
+        }
+    }
+    return {p, line_feeds};
+}
+
+s_scan scan_up_to(const unsigned char* p, const unsigned char* end, unsigned char stop, bool utf8) {
+    unsigned line_feeds = 0;
+    while (p != end && *p != stop && *p != '\r') {
+        if (*p < 0x80) {
+            if (*p == '\n') ++line_feeds;
+            ++p;
+            continue;
+        }
+        const std::size_t length = utf8 ? plain_utf8_length(p, end) : 0;
+        if (length == 0) break;
+        p += length;
+    }
+    return {p, line_feeds};
+}
+
+}  // namespace qbxV2::detail
