@@ -325,6 +325,13 @@ private:
 
 }  // namespace
 
+bool member_plan::has_presence_accessors() const {
+    const bool single = kind == member_kind::attribute || kind == member_kind::text ||
+                        kind == member_kind::value || kind == member_kind::object ||
+                        kind == member_kind::group;
+    return single && !required && has_presence;
+}
+
 std::vector<const member_plan*> class_plan::attributes() const {
     std::vector<const member_plan*> found;
     for (const member_plan& member : members) {

@@ -62,6 +62,9 @@ struct member_plan {
     std::string token;
     row_range next;
     std::string documentation;
+
+    /// A single member has `isset` and `unset` exactly where the format lets it be absent.
+    bool has_presence_accessors() const;
 };
 
 enum class class_kind { type, element, choice, group, root };

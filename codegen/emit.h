@@ -28,6 +28,10 @@ std::string emit_chief_header(const plan& model);
 std::string emit_module_header(const module_plan& module);
 std::string emit_module_source(const plan& model, const module_plan& module);
 
+// emit_driver.cpp: the tests' own description of the model.
+std::string emit_driver(const module_plan& module);
+std::string emit_driver_list(const plan& model);
+
 // emit_members.cpp: accessors, by kind of member.
 void declare_accessors(printer& out, const member_plan& member);
 void declare_storage(printer& out, const member_plan& member);

@@ -62,11 +62,6 @@ bool $C$::setenum_$X$(Eenum_$X$ value) {
 )");
 }
 
-/// A member has presence accessors exactly where the format lets it be absent.
-bool has_presence_accessors(const member_plan& member) {
-    return !member.required && member.has_presence && member.kind != member_kind::value_option;
-}
-
 }  // namespace
 
 void declare_accessors(printer& out, const member_plan& member) {
@@ -81,7 +76,7 @@ void declare_accessors(printer& out, const member_plan& member) {
             declare_enumeration(out, member);
             out.print(comment(refusals(member.value), "    "));
             out.print("    $out$ get_$X$() const;\n    qbxV2::eqbx_error set_$X$($in$ value);\n");
-            if (has_presence_accessors(member))
+            if (member.has_presence_accessors())
                 out.print("    bool isset_$X$() const;\n    void unset_$X$();\n");
             declare_enumeration_accessors(out, member);
             break;
@@ -92,7 +87,7 @@ void declare_accessors(printer& out, const member_plan& member) {
     $class$& get_$X$();
     $class$& assign_$X$($class$ const& value);
 )");
-            if (member.kind != member_kind::object_option && has_presence_accessors(member)) {
+            if (member.has_presence_accessors()) {
                 out.print("    bool isset_$X$() const;\n    void unset_$X$();\n");
             }
             break;
@@ -180,7 +175,7 @@ void define_single(printer& out, const class_plan& owner, const member_plan& mem
         out.print(R"(qbxV2::eqbx_error $C$::set_$X$($in$ value) { return frame::set(m_$X$, value, $limits$); }
 )");
     }
-    if (has_presence_accessors(member)) {
+    if (member.has_presence_accessors()) {
         out.print(R"(bool $C$::isset_$X$() const { return m_$X$.set; }
 void $C$::unset_$X$() { m_$X$.set = false; }
 )");
@@ -193,7 +188,7 @@ void define_object(printer& out, const member_plan& member) {
 $class$& $C$::get_$X$() { return m_$X$.get(); }
 $class$& $C$::assign_$X$($class$ const& value) { return m_$X$.assign(value); }
 )");
-    if (has_presence_accessors(member)) {
+    if (member.has_presence_accessors()) {
         out.print(R"(bool $C$::isset_$X$() const { return m_$X$.is_set(); }
 void $C$::unset_$X$() { m_$X$.unset(); }
 )");

@@ -29,9 +29,11 @@ void generate(const std::string& schema_path, const std::filesystem::path& out) 
     write_if_changed(v2 / "tokens.h", emit_tokens(model));
     write_if_changed(v2 / "format.h", emit_format(model));
     write_if_changed(v2 / "Vrl.h", emit_chief_header(model));
+    write_if_changed(out / "driver" / "classes.cpp", emit_driver_list(model));
     for (const module_plan& module : model.modules) {
         write_if_changed(v2 / (module.name + ".h"), emit_module_header(module));
         write_if_changed(v2 / (module.name + ".cpp"), emit_module_source(model, module));
+        write_if_changed(out / "driver" / (module.name + ".cpp"), emit_driver(module));
     }
 }
 
