@@ -1,0 +1,25 @@
+#pragma once
+
+#include <new>
+#include <stdexcept>
+#include <utility>
+#include <vector>
+
+#include "zip/exception.h"
+
+namespace ZipArchiveLib {
+
+/// Appends to one of the engine's vectors; CZipException 122 when it does not grow.
+template <class T>
+T& PushBack(std::vector<T>& vector, T value) {
+    try {
+        vector.push_back(std::move(value));
+    } catch (const std::bad_alloc&) {
+        CZipException::Raise(CZipException::vectorNotGrown);
+    } catch (const std::length_error&) {
+        CZipException::Raise(CZipException::vectorNotGrown);
+    }
+    return vector.back();
+}
+
+}  // namespace ZipArchiveLib
