@@ -96,7 +96,7 @@ struct class_description {
     bool standalone = false;
     bool declares_namespaces = false;
     int none_state = 0;
-    std::vector<member> members;       ///< declared here, not inherited
+    std::vector<member> members;  ///< declared here, not inherited
     std::vector<group_member> group;
     std::vector<const char*> factory;  ///< classes that `factory` makes, by name
 
