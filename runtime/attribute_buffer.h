@@ -34,7 +34,10 @@ public:
     bool is_end(std::size_t position) const { return position + 1 >= m_bytes.size(); }
     /// The NUL-terminated text at `position`, and the position behind its NUL.
     const char* text_at(std::size_t position) const { return m_bytes.c_str() + position; }
-    std::size_t behind_text(std::size_t position) const;
+    std::size_t behind_text(std::size_t position) const {
+        const std::size_t nul = m_bytes.find('\0', position);
+        return nul == std::string::npos ? m_bytes.size() : nul + 1;
+    }
 
     /// The character at the read position; NUL at the end.
     unsigned char current() const { return static_cast<unsigned char>(m_bytes.c_str()[m_position]); }

@@ -1,5 +1,8 @@
 #include "runtime/byte_scan.h"
 
+#include <cstdint>
+#include <cstring>
+
 namespace qbxV2::detail {
 namespace {
 
@@ -30,24 +33,21 @@ std::size_t plain_utf8_length(const unsigned char* p, const unsigned char* end) 
     return left >= 4 && is_plain_four(p) ? 4 : 0;
 }
 
-s_scan scan_text(const unsigned char* p, const unsigned char* end, unsigned mask, unsigned char also,
-                 bool utf8) {
-    unsigned line_feeds = 0;
-    for (;;) {
-        while (p != end && byte_is(*p, mask)) ++p;
-        if (p == end) break;
-        if (*p == '\n') {
-            ++line_feeds;
-            ++p;
-        } else if (*p == also) {
-            ++p;
-        } else {
-            const std::size_t length = utf8 && *p >= 0x80 ? plain_utf8_length(p, end) : 0;
-            if (length == 0) break;
-            p += length;
-        }
+bool is_printable_ascii(const char* s, std::size_t size) {
+    constexpr std::uint64_t k_high_bits = 0x8080808080808080;
+    constexpr std::uint64_t k_spaces = 0x2020202020202020;
+    std::uint64_t bad = 0;
+    // A byte below 0x20 borrows from its neighbour, but then the answer is no anyway.
+    for (; size >= sizeof bad; size -= sizeof bad, s += sizeof bad) {
+        std::uint64_t bytes;
+        std::memcpy(&bytes, s, sizeof bytes);
+        bad |= bytes | (bytes - k_spaces);
     }
-    return {p, line_feeds};
+    for (; size != 0; --size, ++s) {
+        const auto c = static_cast<unsigned char>(*s);
+        if (c < 0x20 || c >= 0x80) return false;
+    }
+    return (bad & k_high_bits) == 0;
 }
 
 s_scan scan_up_to(const unsigned char* p, const unsigned char* end, unsigned char stop, bool utf8) {

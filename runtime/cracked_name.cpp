@@ -6,12 +6,13 @@ namespace qbxV2 {
 
 void c_cracked_name::set(const c_xml_local* scope, const std::string& name) {
     m_full_name = name;
-    const void* const colon = std::memchr(m_full_name.data(), ':', m_full_name.size());
+    const char* const begin = m_full_name.data();
+    const void* const colon = std::memchr(begin, ':', m_full_name.size());
     m_has_prefix = colon != nullptr;
     const std::size_t prefix_size =
-        m_has_prefix ? static_cast<std::size_t>(static_cast<const char*>(colon) - m_full_name.data()) : 0;
+        m_has_prefix ? static_cast<std::size_t>(static_cast<const char*>(colon) - begin) : 0;
     m_local_at = m_has_prefix ? prefix_size + 1 : 0;
-    m_ns_id = scope->find_namespace_id(m_full_name.data(), prefix_size);
+    m_ns_id = scope->find_namespace_id(begin, prefix_size);
     m_parts_made = false;
 }
 

@@ -66,6 +66,7 @@ eqxp_xml_event c_xml::get_element_name(c_xml_local* scope, std::string* name) {
 }
 
 c_xml::step c_xml::get_tag_or_markup(c_xml_local* scope, std::string* name, eqxp_xml_event* event) {
+    if (m_getter.take_name(name)) return get_tag_attributes(scope, event);
     const int c = m_getter.get();
     if (detail::is_name_start(c)) return get_start_tag(c, scope, name, event);
     switch (c) {
@@ -90,13 +91,17 @@ c_xml::step c_xml::get_start_tag(int first, c_xml_local* scope, std::string* nam
         return step::fail;
     }
     m_getter.unget(c);
+    return get_tag_attributes(scope, event);
+}
+
+c_xml::step c_xml::get_tag_attributes(c_xml_local* scope, eqxp_xml_event* event) {
     if (!get_attributes(scope)) return step::fail;
     *event = EQXP_NAME;
     return step::deliver;
 }
 
 c_xml::step c_xml::get_end_tag(std::string* name, eqxp_xml_event* event) {
-    int c = m_getter.get_rest_of_name(name);
+    int c = m_getter.take_name(name) ? m_getter.get() : m_getter.get_rest_of_name(name);
     if (name->empty()) return step::fail;
     if (detail::is_space(c)) c = m_getter.get_non_ws();
     if (c != '>') {
@@ -193,6 +198,7 @@ bool c_xml::get_element_value(std::string* value, eqbx_whitespace mode, bool exp
     m_getter.set_ws_mode(mode);
     for (;;) {
         m_getter.add_text_run(value, expand_entities);
+        if (m_getter.is_at_tag()) return true;
         const int c = m_getter.get();
         if (c == '<') {
             bool at_tag = false;

@@ -102,6 +102,7 @@ private:
     eqxp_xml_event fail_not_well_formed(const char* message);
     step get_tag_or_markup(c_xml_local* scope, std::string* name, eqxp_xml_event* event);
     step get_start_tag(int first, c_xml_local* scope, std::string* name, eqxp_xml_event* event);
+    step get_tag_attributes(c_xml_local* scope, eqxp_xml_event* event);
     step get_end_tag(std::string* name, eqxp_xml_event* event);
     step get_instruction();
     step get_markup(std::string* name, eqxp_xml_event* event);

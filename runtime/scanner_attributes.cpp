@@ -22,6 +22,8 @@ bool c_xml::get_attributes(c_xml_local* scope) {
     m_attributes.clear();
     m_ns_attributes.clear();
     for (;;) {
+        while (m_getter.take_attribute(&m_attributes.bytes())) {
+        }
         const int first = m_getter.get_non_ws();
         if (!detail::is_name_start(first)) {
             m_getter.unget(first);
@@ -115,8 +117,9 @@ eqxp_xml_event c_xml::get_attribute_name(std::string* name, bool in_pi) {
     // A fatal report ends what was read ahead, too.
     if (!m_attributes.is_used_up() && !m_getter.get_error_handler().is_fatal_errored()) {
         const std::size_t at = m_attributes.position();
-        *name = m_attributes.text_at(at);
-        m_attributes.set_position(m_attributes.behind_text(at));
+        const std::size_t behind = m_attributes.behind_text(at);
+        name->assign(m_attributes.text_at(at), behind - at - 1);
+        m_attributes.set_position(behind);
         return EQXP_NAME;
     }
     const int c = m_getter.get_non_ws();
@@ -132,7 +135,8 @@ bool c_xml::get_attribute_value(std::string* value, eqbx_whitespace mode) {
     c_entity_name_reader_for_attribute_data reader(m_attributes);
     for (;;) {
         const char* const from = m_attributes.text_at(m_attributes.position());
-        const char* const to = from + std::strcspn(from, "&");
+        const char* to = from;
+        while (*to != '\0' && *to != '&') ++to;
         m_getter.add_chars_wsp(value, from, to);
         m_attributes.set_position(m_attributes.position() + static_cast<std::size_t>(to - from));
         const char stop = *to;

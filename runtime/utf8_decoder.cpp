@@ -62,7 +62,7 @@ bool c_get_as_utf8::step_back(int c) {
     if (m_run_blocks != 0 || c < 0 || c >= 0x80) return false;
     c_read::s_run& run = m_source.m_run;
     if (run.next == run.begin || run.next[-1] != c) return false;
-    if (m_run_mark == nullptr || m_run_mark < run.next) m_run_mark = run.next;
+    note_look_ahead(run.next);
     --run.next;
     return true;
 }

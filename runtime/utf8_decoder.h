@@ -98,6 +98,11 @@ public:
         m_source.m_run.next = to;
         m_line += line_feeds;
     }
+    /// Tells that the bytes before `to` would have been read and pushed back on the way through `get`. Only a
+    /// `rewind` of the source can show the difference.
+    void note_look_ahead(const unsigned char* to) {
+        if (m_run_mark == nullptr || m_run_mark < to) m_run_mark = to;
+    }
     /// Whether a run may hold UTF-8 sequences too. Otherwise a byte from 0x80 ends it.
     bool run_may_hold_utf8() const { return m_encoding == ENCODING_UTF8; }
 

@@ -1,5 +1,7 @@
 #include "runtime/xml_text_source.h"
 
+#include <cstring>
+
 #include "runtime/byte_scan.h"
 #include "runtime/character_class.h"
 
@@ -14,7 +16,7 @@ void c_get_for_xml::rewind() {
     c_get_with_entities::rewind();
 }
 
-int c_get_for_xml::get_non_ws() {
+int c_get_for_xml::skip_ws_and_get() {
     for (;;) {
         s_byte_run run;
         if (open_run(&run)) {
@@ -53,12 +55,11 @@ bool c_get_for_xml::get_simple_quoted_value(std::string* value) {
 }
 
 bool c_get_for_xml::get_up_to_quote(int quote, std::string* value) {
-    const auto other_quote = static_cast<unsigned char>(quote == '"' ? '\'' : '"');
     for (;;) {
         s_byte_run run;
         if (open_run(&run)) {
             const detail::s_scan scan =
-                detail::scan_text(run.next, run.end, detail::cc_value, other_quote, run_may_hold_utf8());
+                detail::scan_value(run.next, run.end, static_cast<unsigned char>(quote), run_may_hold_utf8());
             value->append(reinterpret_cast<const char*>(run.next),
                           static_cast<std::size_t>(scan.end - run.next));
             take_run(scan.end, scan.line_feeds);
@@ -74,8 +75,7 @@ int c_get_for_xml::get_rest_of_name(std::string* name) {
     for (;;) {
         s_byte_run run;
         if (open_run(&run)) {
-            const unsigned char* p = run.next;
-            while (p != run.end && byte_is(*p, detail::cc_plain_name)) ++p;
+            const unsigned char* const p = detail::end_of_plain_name(run.next, run.end);
             name->append(reinterpret_cast<const char*>(run.next), static_cast<std::size_t>(p - run.next));
             take_run(p);
         }
@@ -86,23 +86,68 @@ int c_get_for_xml::get_rest_of_name(std::string* name) {
 }
 
 bool c_get_for_xml::read_end_tag(const std::string& name) {
+    if (take_end_tag(name)) return true;
     if (get_non_ws() != '<' || get() != '/') return false;
-    const char* expected = name.c_str();
-    const char* const expected_end = expected + name.size();
-    s_byte_run run;
-    if (open_run(&run)) {
-        const unsigned char* p = run.next;
-        while (expected != expected_end && p != run.end && *p == static_cast<unsigned char>(*expected) &&
-               byte_is(*p, detail::cc_plain_name)) {
-            ++p;
-            ++expected;
-        }
-        take_run(p);
-    }
-    for (; expected != expected_end; ++expected) {
-        if (get() != static_cast<unsigned char>(*expected)) return false;
+    for (const char expected : name) {
+        if (get() != static_cast<unsigned char>(expected)) return false;
     }
     return get_non_ws() == '>';
+}
+
+/// The end tag when it can be had at once and has no white space. False, with nothing read, otherwise.
+bool c_get_for_xml::take_end_tag(const std::string& name) {
+    s_byte_run run;
+    const std::size_t size = name.size();
+    if (!open_run(&run) || static_cast<std::size_t>(run.end - run.next) < size + 3) return false;
+    const unsigned char* const p = run.next;
+    if (p[0] != '<' || p[1] != '/' || p[size + 2] != '>' || std::memcmp(p + 2, name.data(), size) != 0)
+        return false;
+    if (!detail::is_printable_ascii(name.data(), size)) return false;
+    take_run(p + size + 3);
+    return true;
+}
+
+bool c_get_for_xml::is_at_tag() {
+    s_byte_run run;
+    if (!open_run(&run) || run.end - run.next < 2 || run.next[0] != '<') return false;
+    const unsigned char behind = run.next[1];
+    if (behind != '/' && !byte_is(behind, detail::cc_plain_name)) return false;
+    note_look_ahead(run.next + 2);
+    return true;
+}
+
+bool c_get_for_xml::take_name(std::string* name) {
+    s_byte_run run;
+    if (!open_run(&run) || !detail::is_plain_name_start(*run.next)) return false;
+    const unsigned char* const p = detail::end_of_plain_name(run.next, run.end);
+    // A line feed counts once more when it is pushed back, so that is left to `get`.
+    if (p == run.end || *p >= 0x80 || *p == '\r' || *p == '\n') return false;
+    name->assign(reinterpret_cast<const char*>(run.next), static_cast<std::size_t>(p - run.next));
+    take_run(p);
+    note_look_ahead(p + 1);
+    return true;
+}
+
+bool c_get_for_xml::take_attribute(std::string* bytes) {
+    s_byte_run run;
+    if (!open_run(&run)) return false;
+    const unsigned char* p = run.next;
+    while (p != run.end && *p == ' ') ++p;
+    const unsigned char* const name = p;
+    if (p == run.end || *p == 'x' || !detail::is_plain_name_start(*p)) return false;
+    const unsigned char* const equals = detail::end_of_plain_name(p, run.end);
+    if (run.end - equals < 2 || *equals != '=') return false;
+    const unsigned char quote = equals[1];
+    if (quote != '"' && quote != '\'') return false;
+    const detail::s_scan value = detail::scan_value(equals + 2, run.end, quote, run_may_hold_utf8());
+    if (value.end == run.end || *value.end != quote) return false;
+    // The text as written has the layout that is wanted, but for the two NULs.
+    const std::size_t at = bytes->size();
+    bytes->append(reinterpret_cast<const char*>(name), static_cast<std::size_t>(value.end + 1 - name));
+    (*bytes)[at + static_cast<std::size_t>(equals - name)] = '\0';
+    bytes->back() = '\0';
+    take_run(value.end + 1, value.line_feeds);
+    return true;
 }
 
 /// Adds, or with null skips, what comes before `stop` and can be had at once.
@@ -226,30 +271,23 @@ void c_get_for_xml::add_chars_wsp(std::string* s, const char* from, const char* 
 }
 
 void c_get_for_xml::collapse(std::string* s, const char* from, const char* to) {
-    const auto is_space_at = [](const char* p) {
-        return byte_is(static_cast<unsigned char>(*p), detail::cc_space);
-    };
-    while (from != to) {
-        if (is_space_at(from)) {
-            m_pending_space = true;
-            ++from;
-            continue;
-        }
-        const char* word_end = from + 1;
-        while (word_end != to && !is_space_at(word_end)) ++word_end;
+    const auto* p = reinterpret_cast<const unsigned char*>(from);
+    const auto* const end = reinterpret_cast<const unsigned char*>(to);
+    for (;;) {
+        for (; p != end && byte_is(*p, detail::cc_space); ++p) m_pending_space = true;
+        if (p == end) return;
+        const unsigned char* const word_end = detail::find_space(p, end);
         if (m_pending_space && !s->empty()) s->push_back(' ');
         m_pending_space = false;
-        s->append(from, word_end);
-        from = word_end;
+        s->append(reinterpret_cast<const char*>(p), static_cast<std::size_t>(word_end - p));
+        p = word_end;
     }
 }
 
 void c_get_for_xml::add_text_run(std::string* s, bool stop_at_ampersand) {
     s_byte_run run;
     if (!open_run(&run)) return;
-    const auto also = static_cast<unsigned char>(stop_at_ampersand ? '\n' : '&');
-    const detail::s_scan scan =
-        detail::scan_text(run.next, run.end, detail::cc_text, also, run_may_hold_utf8());
+    const detail::s_scan scan = detail::scan_text(run.next, run.end, !stop_at_ampersand, run_may_hold_utf8());
     add_chars_wsp(s, reinterpret_cast<const char*>(run.next), reinterpret_cast<const char*>(scan.end));
     take_run(scan.end, scan.line_feeds);
 }

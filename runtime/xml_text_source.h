@@ -3,6 +3,7 @@
 #include <string>
 
 #include "platform/api.h"
+#include "runtime/character_class.h"
 #include "runtime/entities.h"
 #include "runtime/white_space.h"
 
@@ -18,7 +19,10 @@ public:
         : c_get_with_entities(source, errors), m_ws_for_char_refs(ws_for_char_refs) {}
 
     /// The next value that is no white space; -1 at the end.
-    int get_non_ws();
+    int get_non_ws() {
+        int c;
+        return get_plain(&c) && !detail::is_space(c) ? c : skip_ws_and_get();
+    }
     /// Reads and compares. On a mismatch false, with the character at fault consumed.
     bool read_specified_string_from_input(const char* s);
     /// Skips white space and reads a value in single or double quotes. False without a quote, or at the end
@@ -60,6 +64,15 @@ public:
     /// Back to the start; white space is preserved again.
     void rewind();
 
+    /// Reads a name that can be had at once; what stands behind it is left in the input. False, with nothing
+    /// read, when it has to be read character by character, or when there is none.
+    bool take_name(std::string* name);
+    /// Reads an attribute that can be had at once, after optional white space, and appends its name, NUL, the
+    /// opening quote, the value and NUL. False, with nothing read, when it has to be read character by
+    /// character, when its name could be that of a namespace declaration, or when there is none.
+    bool take_attribute(std::string* bytes);
+    /// Whether a tag stands next, as far as that can be seen without reading.
+    bool is_at_tag();
     /// Reads the rest of a name, and the value behind it, which is the result.
     int get_rest_of_name(std::string* name);
     /// Reads up to `quote` and consumes it. False at the end of input.
@@ -69,6 +82,9 @@ public:
     bool read_end_tag(const std::string& name);
 
 private:
+    int skip_ws_and_get();
+    bool take_end_tag(const std::string& name);
+
     enum class pseudo_value { none, read, bad };
 
     bool read_version();
