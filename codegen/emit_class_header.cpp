@@ -65,7 +65,8 @@ void declare_copying(printer& out) {
 
 void declare_entry_points(printer& out) {
     out.print(R"(
-    /// Reads a document: packed where the path ends in ".vrlz", plain otherwise. The object isn't reset first.
+    /// Reads a document: packed where the path ends in ".vrlz", plain otherwise. Does not reset the object
+    /// first.
     qbxV2::eqbx_error loadFile(std::wstring const& path);
     qbxV2::eqbx_error loadString(std::wstring const& xml);
     /// Writes a document to a path that ends in ".vrl" or ".vrlz" (EQBX_USER_ERROR_2 otherwise), with CR LF
@@ -94,8 +95,8 @@ void declare_steps(printer& out, const class_plan& made) {
     const bool own_content = !made.children().empty() || made.text() != nullptr || made.base.empty();
     out.print("\nprotected:\n    friend struct frame::access;\n");
     if (own_attributes) {
-        out.print(R"(    bool unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name,
-                              qbxV2::eqbx_error* error);
+        out.print(
+            R"(    bool unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name, qbxV2::eqbx_error* error);
 )");
         if (!made.nillable || made.base.empty()) {
             out.print(R"(    qbxV2::eqbx_error unmarshal_attributes_check(qbxV2::c_xml_reader& reader);

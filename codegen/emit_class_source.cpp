@@ -63,7 +63,7 @@ std::string occurs_expression(const class_plan& made) {
         if (!test.empty()) tests.push_back(test);
     }
     if (tests.empty()) tests.push_back("true");
-    const std::string all = join(tests, " &&\n           ");
+    const std::string all = join(tests, " && ");
     if (!made.nillable) return all;
     return tests.size() == 1 ? "m_nil || " + all : "m_nil || (" + all + ")";
 }
@@ -108,9 +108,7 @@ void $C$::swap([[maybe_unused]] $C$& other) {
     if (made.nillable) out.print("    std::swap(m_nil, other.m_nil);\n");
     out.print(R"(}
 void $C$::reset() { frame::reset_by_swap(*this); }
-bool $C$::is_occurs_ok() const {
-    return $occurs$;
-}
+bool $C$::is_occurs_ok() const { return $occurs$; }
 )",
               {{"occurs", occurs_expression(made)}});
 }

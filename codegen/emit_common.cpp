@@ -1,12 +1,8 @@
 #include "codegen/emit.h"
+#include "codegen/layout.h"
 #include "codegen/plan_members.h"
 
 namespace vrl_codegen {
-namespace {
-
-constexpr std::size_t k_line_length = 108;
-
-}  // namespace
 
 std::string comment(const std::string& text, const std::string& indent) {
     std::string lines;

@@ -65,10 +65,10 @@ bool $C$::unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& n
         int row = 0;
         for (const member_plan* member : made.attributes()) {
             out.print(
-                "        case $row$: return in.read(m_$X$, $limits$);\n",
+                "        case $row$:\n            return in.read(m_$X$, $limits$);\n",
                 {{"row", std::to_string(row++)}, {"X", member->name}, {"limits", member->value.limits}});
         }
-        out.print("        default: return $fallback$;\n    }\n}\n", {{"fallback", fallback}});
+        out.print("        default:\n            return $fallback$;\n    }\n}\n", {{"fallback", fallback}});
     } else {
         out.print("    return $fallback$;\n}\n", {{"fallback", fallback}});
     }
@@ -167,7 +167,13 @@ bool $C$::unmarshal_body(qbxV2::c_xml_reader& reader, std::string* name, qbxV2::
                    {"what", member->kind == member_kind::value_option ? "value" : "object"},
                    {"limits", limits}});
     }
-    out.print("        default: in.no_option(); break;\n    }\n    return in.done();\n}\n");
+    out.print(R"(        default:
+            in.no_option();
+            break;
+    }
+    return in.done();
+}
+)");
 }
 
 void define_any_body(printer& out) {

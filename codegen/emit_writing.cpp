@@ -57,11 +57,15 @@ qbxV2::eqbx_error $C$::marshal_child_elements(qbxV2::c_xml_writer& out) const {
 )");
     for (const member_plan* member : made.children()) {
         out.print(
-            "        case chosen_$X$: w.$what$(m_$X$.get(), \"Vrl:$X$\"); break;\n",
+            R"(        case chosen_$X$:
+            w.$what$(m_$X$.get(), "Vrl:$X$");
+            break;
+)",
             {{"X", member->name}, {"what", member->kind == member_kind::value_option ? "value" : "object"}});
     }
     out.print(
-        R"(        default: return out.handle_error(qbxV2::EQBX_BAD_CHOICE, "Vrl:$C$", k_source, __LINE__);
+        R"(        default:
+            return out.handle_error(qbxV2::EQBX_BAD_CHOICE, "Vrl:$C$", k_source, __LINE__);
     }
     return w.result();
 }

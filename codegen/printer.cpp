@@ -2,6 +2,8 @@
 
 #include <stdexcept>
 
+#include "codegen/layout.h"
+
 namespace vrl_codegen {
 namespace {
 
@@ -35,5 +37,7 @@ void printer::print(const std::string& text, const values& holes) {
         done = close + 1;
     }
 }
+
+std::string printer::text() const { return lay_out(m_text); }
 
 }  // namespace vrl_codegen

@@ -19,7 +19,8 @@ public:
     /// Throws `std::logic_error` for a hole that nobody fills: a misspelt name must not end in the output.
     void print(const std::string& text, const values& holes = {});
 
-    const std::string& text() const { return m_text; }
+    /// What was printed, laid out.
+    std::string text() const;
 
 private:
     const std::string& value_of(const std::string& name, const values& holes) const;
