@@ -38,15 +38,22 @@ std::string_view reference_for(std::uint32_t code) {
     }
 }
 
-/// Whether `code` is one ASCII byte that stands for itself.
-bool is_plain(std::uint32_t code) {
-    return code < 0x80 && code != '"' && code != '\'' && code != '&' && code != '<';
+constexpr std::array<bool, 0x80> make_plain_codes() {
+    std::array<bool, 0x80> table{};
+    for (bool& is_plain : table) is_plain = true;
+    for (const unsigned char c : {'"', '\'', '&', '<'}) table[c] = false;
+    return table;
 }
+
+/// The ASCII characters that stand for themselves.
+constexpr std::array<bool, 0x80> k_plain_codes = make_plain_codes();
+
+bool is_plain(std::uint32_t code) { return code < k_plain_codes.size() && k_plain_codes[code]; }
 
 /// Appends the plain elements from `at` on and returns the place of the first other one.
 std::size_t append_plain_run(std::string& out, const wchar_t* text, std::size_t at, std::size_t size) {
     std::size_t end = at;
-    while (end != size && is_plain(static_cast<std::uint32_t>(text[end]))) ++end;
+    while (end != size && is_plain(detail::code_of(text[end]))) ++end;
     const std::size_t before = out.size();
     out.resize(before + (end - at));
     for (char* to = out.data() + before; at != end; ++at) *to++ = static_cast<char>(text[at]);
@@ -105,7 +112,7 @@ std::ostream& operator<<(std::ostream& os, const c_as_xml<std::string>& text) {
 std::ostream& operator<<(std::ostream& os, const c_as_ascii<std::wstring>& text) {
     std::string out;
     for (const wchar_t element : text.get()) {
-        const auto code = static_cast<std::uint32_t>(element);
+        const auto code = detail::code_of(element);
         if (code < 0x80) {
             out.push_back(static_cast<char>(code));
         } else {
@@ -136,11 +143,11 @@ void append_escaped(std::string& out, const std::wstring& text) {
     for (std::size_t at = 0; at < size;) {
         at = append_plain_run(out, text.data(), at, size);
         if (at == size) return;
-        auto code = static_cast<std::uint32_t>(text[at++]);
+        auto code = detail::code_of(text[at++]);
         if (detail::is_high_surrogate(code)) {
             // Intended: a high surrogate without its partner ends the text, and no error is raised.
             if (at == size) return;
-            const auto low = static_cast<std::uint32_t>(text[at++]);
+            const auto low = detail::code_of(text[at++]);
             if (!detail::is_low_surrogate(low)) return;
             code = detail::from_surrogates(code, low);
         }

@@ -1,9 +1,12 @@
 #include "runtime/date_time_printer.h"
 
+#include <algorithm>
 #include <charconv>
 #include <cmath>
 #include <iomanip>
 #include <ostream>
+
+#include "runtime/number_text.h"
 
 namespace qbxV2::detail {
 namespace {
@@ -17,18 +20,37 @@ public:
 
     void put(char c) { *m_at++ = c; }
 
-    template <typename Number>
-    void number(Number value, int width) {
-        char digits[16];
-        char* const end = std::to_chars(digits, digits + sizeof digits, value).ptr;
-        for (auto missing = width - (end - digits); missing > 0; --missing) put('0');
-        for (const char* c = digits; c != end; ++c) put(*c);
+    void number(int value, int width) {
+        if (value >= 0) return number(static_cast<unsigned int>(value), width);
+        padded(value, width);
+    }
+
+    void number(unsigned int value, int width) {
+        if (width == 2 && value < 100) return two_digits(value);
+        if (width == 4 && value < 10000) {
+            two_digits(value / 100);
+            return two_digits(value % 100);
+        }
+        padded(value, width);
     }
 
     void seconds(float secs) { m_at = format_seconds(secs, m_at); }
     char* end() const { return m_at; }
 
 private:
+    void two_digits(unsigned int value) {
+        put(static_cast<char>('0' + value / 10));
+        put(static_cast<char>('0' + value % 10));
+    }
+
+    template <typename Number>
+    void padded(Number value, int width) {
+        char digits[16];
+        char* const end = std::to_chars(digits, digits + sizeof digits, value).ptr;
+        for (auto missing = width - (end - digits); missing > 0; --missing) put('0');
+        m_at = std::copy(digits, end, m_at);
+    }
+
     char* m_at;
 };
 
@@ -152,8 +174,10 @@ char* format_seconds(float secs, char* out) {
         if (static_cast<float>(whole) == secs && !std::signbit(secs))
             return std::to_chars(out, out + 2, whole).ptr;
     }
-    const auto format = needs_fixed(secs) ? std::chars_format::fixed : std::chars_format::general;
-    return std::to_chars(out, out + 64, static_cast<double>(secs), format, k_precision).ptr;
+    const auto value = static_cast<double>(secs);
+    if (needs_fixed(secs))
+        return std::to_chars(out, out + 64, value, std::chars_format::fixed, k_precision).ptr;
+    return out + format_general(out, value, k_precision);
 }
 
 void stream_seconds(float secs, std::ostream& os) {

@@ -1,5 +1,6 @@
 #include "runtime/number_text.h"
 
+#include <algorithm>
 #include <array>
 #include <charconv>
 #include <clocale>
@@ -19,13 +20,10 @@ using detail::text_cursor;
 
 namespace {
 
-/// The defined way: `atof`, whose point is the process's decimal mark. Where that is a comma, the first point
-/// of the text becomes one.
+/// The defined way: `atof`, whose point is the process's decimal mark.
 double by_atof(const char* text, std::size_t size) {
-    std::string copy(text, size);
-    const std::size_t point = copy.find('.');
-    if (point != std::string::npos && std::localeconv()->decimal_point[0] == ',') copy[point] = ',';
-    // NOLINTNEXTLINE(bugprone-unchecked-string-to-number-conversion, cert-err34-c): any text has a value
+    const std::string copy =
+        detail::with_decimal_mark(std::string(text, size), std::localeconv()->decimal_point);
     return std::atof(copy.c_str());
 }
 
@@ -63,110 +61,101 @@ std::size_t format_special(char* out, double value) {
 constexpr int k_double_digits = 14;
 constexpr int k_float_digits = 7;
 
-/// Decimal digits without trailing zeros; the point stands behind the first one, then times ten to
-/// `exponent`.
-struct decimal_digits {
-    std::array<char, 24> digit{};
-    int count = 0;
+/// The powers of ten that `double` holds exactly.
+constexpr std::array<double, 23> k_powers = {1e0,  1e1,  1e2,  1e3,  1e4,  1e5,  1e6,  1e7,
+                                             1e8,  1e9,  1e10, 1e11, 1e12, 1e13, 1e14, 1e15,
+                                             1e16, 1e17, 1e18, 1e19, 1e20, 1e21, 1e22};
+
+/// The point stands behind the first of `digits`; the whole is multiplied by ten to `exponent`.
+struct rounded_number {
+    std::uint64_t digits = 0;
     int exponent = 0;
 };
 
-/// Writes `value`, which is positive, if it is a whole number of millionths that `double` tells from its
-/// neighbours.
-///
-/// For `n` below 10^14, if n / 10^6 gives back `value`, then n / 10^6 lies within half a unit in the last
-/// place of `value`: 14 significant digits are coarser than that by a factor of 40 and more, so rounding
-/// `value` to them gives `n`. Returns 0 if it is no such number.
-std::size_t format_millionths(char* out, double value) {
-    constexpr double k_scale = 1e6;
-    constexpr double k_limit = 1e8;
-    constexpr double k_least = 1e-4;  // below, "%g" changes to an exponent
-    if (!(value < k_limit && value >= k_least)) return 0;
-    const auto millionths = static_cast<std::uint64_t>(value * k_scale + 0.5);
-    if (static_cast<double>(millionths) / k_scale != value) return 0;
-    char* const end = std::to_chars(out, out + k_number_text_size, millionths / 1000000U).ptr;
-    auto fraction = static_cast<std::uint32_t>(millionths % 1000000U);
-    if (fraction == 0) return static_cast<std::size_t>(end - out);
-    int digits = 6;
-    for (; fraction % 10U == 0; --digits) fraction /= 10U;
-    *end = '.';
-    for (int i = digits; i > 0; --i, fraction /= 10U) end[i] = static_cast<char>('0' + fraction % 10U);
-    return static_cast<std::size_t>(end + 1 + digits - out);
+/// `digits`, which is not 0 and below 10^16, without the zeros at its end.
+std::uint64_t without_trailing_zeros(std::uint64_t digits) {
+    if (digits % 100000000U == 0) digits /= 100000000U;
+    if (digits % 10000U == 0) digits /= 10000U;
+    if (digits % 100U == 0) digits /= 100U;
+    return digits % 10U == 0 ? digits / 10U : digits;
 }
 
-/// The fewest digits that give `value` back, which is positive.
-decimal_digits shortest_digits(double value) {
-    std::array<char, k_number_text_size> text{};
-    const char* const end =
-        std::to_chars(text.data(), text.data() + text.size(), value, std::chars_format::scientific).ptr;
-    decimal_digits result;
-    const char* at = text.data();
-    for (; *at != 'e'; ++at) {
-        if (*at != '.') result.digit[static_cast<std::size_t>(result.count++)] = *at;
-    }
-    const bool negative = at[1] == '-';
-    std::from_chars(at + 2, end, result.exponent);
-    if (negative) result.exponent = -result.exponent;
-    return result;
+/// The power of ten below `value`, which is positive and normal, or the one below that.
+int estimate_exponent(double value) {
+    constexpr int k_mantissa_bits = 52;
+    constexpr int k_bias = 1023;
+    std::uint64_t bits = 0;
+    std::memcpy(&bits, &value, sizeof bits);
+    const int binary = static_cast<int>(bits >> k_mantissa_bits) - k_bias;
+    return (binary * 78913) >> 18;  // times log10(2), rounded down
 }
 
-/// Rounds the shortest digits of `value` to 14 if that surely gives what rounding `value` itself does.
+/// Rounds `value`, which is positive, to `precision` digits, 1 to 14. False when that needs more than one
+/// exact power of ten, or when the product with it does not tell for sure.
 ///
-/// More than 14 digits: a half-way point between two neighbours of 14 digits has 15. If it lay between
-/// `value` and its shortest digits it would give `value` back too, and be shorter, or as short and nearer: so
-/// they lie on the same side of it, unless they are that point. Up to 14 digits: they lie within half a unit
-/// in the last place of `value`, and for a normal number 14 digits are coarser than that.
-bool round_to_14(decimal_digits& digits, double value) {
-    if (digits.count <= k_double_digits) return value >= std::numeric_limits<double>::min();
-    const char next = digits.digit[k_double_digits];
-    if (digits.count == k_double_digits + 1 && next == '5') return false;
-    digits.count = k_double_digits;
-    if (next < '5') return true;
-    std::size_t last = k_double_digits - 1;
-    while (last != 0 && digits.digit[last] == '9') digits.digit[last--] = '0';
-    if (digits.digit[last] == '9') {
-        digits.digit[last] = '1';
-        ++digits.exponent;
-    } else {
-        ++digits.digit[last];
+/// The product is below 10^14, and so off by 1/128 at most: if its fraction is farther than that from one
+/// half, it rounds to the whole number that the exact product rounds to. Near a power of ten the product may
+/// come out on the wrong side of it; both sides then give the same digits.
+bool round_to_digits(double value, int precision, rounded_number& result) {
+    constexpr double k_doubt = 1.0 / 64;
+    const auto places = static_cast<std::size_t>(precision);
+    int exponent = estimate_exponent(value);
+    auto scale = static_cast<std::size_t>(precision - 1 - exponent);  // huge if negative
+    if (scale >= k_powers.size()) return false;
+    double product = value * k_powers[scale];
+    if (product >= k_powers[places]) {
+        if (scale == 0) return false;
+        ++exponent;
+        product = value * k_powers[--scale];
     }
+    auto digits = static_cast<std::uint64_t>(product);
+    const double fraction = product - static_cast<double>(digits);
+    if (std::fabs(fraction - 0.5) < k_doubt) return false;
+    if (fraction > 0.5) ++digits;
+    const bool carries = static_cast<double>(digits) == k_powers[places];
+    result = {without_trailing_zeros(digits), carries ? exponent + 1 : exponent};
     return true;
 }
 
-/// The layout of "%g": with an exponent below 10^-4 and from 10^14 on, no trailing zeros behind the point.
-std::size_t put_general(char* out, decimal_digits& digits) {
-    const char* const first = digits.digit.data();
-    int count = digits.count;
-    while (count > 1 && first[count - 1] == '0') --count;
-    const auto put_digits = [&](char* to, int from, int until) {
-        for (int i = from; i < until; ++i) *to++ = i < count ? first[i] : '0';
-        return to;
-    };
+/// The layout of "%g": an exponent below 10^-4 and from 10^precision on, and no trailing zeros behind the
+/// point.
+std::size_t put_general(char* out, const rounded_number& number, int precision) {
+    std::array<char, 24> text;
+    const char* const last = std::to_chars(text.data(), text.data() + text.size(), number.digits).ptr;
+    const int exponent = number.exponent;
+    const char* const first = text.data();
+    const auto count = static_cast<int>(last - first);
     char* at = out;
-    if (digits.exponent < -4 || digits.exponent >= k_double_digits) {
-        *at++ = first[0];
+    if (exponent < -4 || exponent >= precision) {
+        *at++ = *first;
         if (count > 1) *at++ = '.';
-        at = put_digits(at, 1, count);
+        at = std::copy(first + 1, last, at);
         *at++ = 'e';
-        *at++ = digits.exponent < 0 ? '-' : '+';
-        const int magnitude = std::abs(digits.exponent);
+        *at++ = exponent < 0 ? '-' : '+';
+        const int magnitude = std::abs(exponent);
         if (magnitude < 10) *at++ = '0';
         at = std::to_chars(at, out + k_number_text_size, magnitude).ptr;
-    } else if (digits.exponent < 0) {
-        *at++ = '0';
-        *at++ = '.';
-        for (int i = -1; i > digits.exponent; --i) *at++ = '0';
-        at = put_digits(at, 0, count);
+    } else if (exponent < 0) {
+        at = std::fill_n(std::copy_n("0.", 2, at), -1 - exponent, '0');
+        at = std::copy(first, last, at);
+    } else if (count <= exponent + 1) {
+        at = std::fill_n(std::copy(first, last, at), exponent + 1 - count, '0');
     } else {
-        const int whole = digits.exponent + 1;
-        at = put_digits(at, 0, whole);
-        if (count > whole) *at++ = '.';
-        at = put_digits(at, whole, count);
+        at = std::copy_n(first, exponent + 1, at);
+        *at++ = '.';
+        at = std::copy(first + exponent + 1, last, at);
     }
     return static_cast<std::size_t>(at - out);
 }
 
 }  // namespace
+
+std::string detail::with_decimal_mark(std::string text, const char* decimal_mark) {
+    if (decimal_mark[0] != ',') return text;
+    const std::size_t point = text.find('.');
+    if (point != std::string::npos) text[point] = ',';
+    return text;
+}
 
 double text_to_double(const std::string& text) { return text_to_double(text.data(), text.size()); }
 double text_to_double(const char* text, std::size_t size) {
@@ -217,6 +206,14 @@ bool text_to_bool(const char* text, std::size_t size) {
 }
 
 std::size_t format_general(char* out, double value, int precision) {
+    const double magnitude = std::fabs(value);
+    rounded_number number;
+    if (precision <= k_double_digits && std::isnormal(value) &&
+        round_to_digits(magnitude, precision, number)) {
+        const std::size_t sign = value < 0 ? 1 : 0;
+        if (sign) *out = '-';
+        return sign + put_general(out + sign, number, precision);
+    }
     const auto written =
         std::to_chars(out, out + k_number_text_size, value, std::chars_format::general, precision);
     return static_cast<std::size_t>(written.ptr - out);
@@ -224,12 +221,6 @@ std::size_t format_general(char* out, double value, int precision) {
 
 std::size_t format_double(char* out, double value) {
     if (const std::size_t size = format_special(out, value)) return size;
-    const std::size_t sign = value < 0 ? 1 : 0;
-    if (sign) *out = '-';
-    const double magnitude = std::fabs(value);
-    if (const std::size_t size = format_millionths(out + sign, magnitude)) return sign + size;
-    decimal_digits digits = shortest_digits(magnitude);
-    if (round_to_14(digits, magnitude)) return sign + put_general(out + sign, digits);
     return format_general(out, value, k_double_digits);
 }
 

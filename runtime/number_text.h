@@ -48,4 +48,10 @@ void append_float(std::string& out, float value);
 void append_int(std::string& out, int value);
 void append_unsigned(std::string& out, unsigned int value);
 
+namespace detail {
+
+/// The text with its first point replaced, where the process's decimal mark begins with a comma.
+std::string with_decimal_mark(std::string text, const char* decimal_mark);
+
+}  // namespace detail
 }  // namespace qbxV2

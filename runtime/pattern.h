@@ -5,7 +5,7 @@
 
 #include "platform/api.h"
 
-struct _xmlRegexp;
+struct _xmlRegexp;  // NOLINT(bugprone-reserved-identifier): the name that libxml2 gives it
 
 namespace qbxV2 {
 

@@ -7,6 +7,7 @@
 namespace qbxV2 {
 
 using detail::append_utf8;
+using detail::code_of;
 using detail::from_surrogates;
 using detail::is_high_surrogate;
 using detail::is_low_surrogate;
@@ -16,10 +17,10 @@ namespace {
 /// Converts from the element at `at` on, appending to `out`.
 void append_utf8_from(std::string& out, const std::wstring& in, std::size_t at) {
     while (at < in.size()) {
-        auto code = static_cast<std::uint32_t>(in[at++]);
+        auto code = code_of(in[at++]);
         if (is_high_surrogate(code) && at < in.size()) {
             // Intended: the element behind a high surrogate is used up even when it is no low surrogate.
-            const auto next = static_cast<std::uint32_t>(in[at++]);
+            const auto next = code_of(in[at++]);
             if (is_low_surrogate(next)) code = from_surrogates(code, next);
         }
         // Intended: an element of 0 vanishes.
@@ -89,7 +90,7 @@ std::string& convert(std::string* out, const std::wstring& in) {
     char* const bytes = out->data();
     std::size_t plain = 0;
     for (; plain < in.size(); ++plain) {
-        const auto code = static_cast<std::uint32_t>(in[plain]);
+        const auto code = code_of(in[plain]);
         if (code - 1 >= 0x7F) break;
         bytes[plain] = static_cast<char>(code);
     }

@@ -2,8 +2,14 @@
 
 #include <cstdint>
 #include <string>
+#include <type_traits>
 
 namespace qbxV2::detail {
+
+/// The value of an element, whether `wchar_t` is signed or not.
+constexpr std::uint32_t code_of(wchar_t element) {
+    return static_cast<std::make_unsigned_t<wchar_t>>(element);
+}
 
 constexpr bool is_high_surrogate(std::uint32_t unit) { return unit >= 0xD800 && unit <= 0xDBFF; }
 constexpr bool is_low_surrogate(std::uint32_t unit) { return unit >= 0xDC00 && unit <= 0xDFFF; }
