@@ -41,7 +41,7 @@ std::string_view reference_for(std::uint32_t code) {
 constexpr std::array<bool, 0x80> make_plain_codes() {
     std::array<bool, 0x80> table{};
     for (bool& is_plain : table) is_plain = true;
-    for (const unsigned char c : {'"', '\'', '&', '<'}) table[c] = false;
+    for (const char c : {'"', '\'', '&', '<'}) table[static_cast<unsigned char>(c)] = false;
     return table;
 }
 
