@@ -8,6 +8,7 @@
 #include "runtime/wrapping_number.h"
 
 namespace qbxV2 {
+
 using detail::is_ascii_digit;
 using detail::text_cursor;
 using detail::wrapping_int;

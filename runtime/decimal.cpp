@@ -13,6 +13,7 @@
 #include "runtime/wrapping_number.h"
 
 namespace qbxV2 {
+
 using detail::text_cursor;
 using detail::wrapping_int;
 using detail::wrapping_unsigned;

@@ -15,6 +15,7 @@
 #include "runtime/text_cursor.h"
 
 namespace qbxV2 {
+
 using detail::is_ascii_digit;
 using detail::text_cursor;
 

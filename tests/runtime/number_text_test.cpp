@@ -294,6 +294,25 @@ TEST(FormatDoubleEverywhere, EqualsPrintfAtPowersAndDenormals) {
         expect_same_as_printf(from_bits(random() >> (12 + random() % 50)));
 }
 
+TEST(FormatGeneral, EqualsPrintfAtEveryPrecision) {
+    std::mt19937_64 random(16);
+    for (int precision = 1; precision <= 17; ++precision) {
+        const std::string format = "%." + std::to_string(precision) + "g";
+        for (int round = 0; round < 3000; ++round) {
+            const double any = from_bits(random());
+            const double near_one =
+                std::ldexp(static_cast<double>(random() >> 11), static_cast<int>(random() % 90) - 90);
+            const double tie = static_cast<double>(random() % 100000) + 0.5;
+            for (const double value : {any, near_one, tie, -tie}) {
+                if (value == 0.0 || !std::isfinite(value)) continue;
+                char text[k_number_text_size];
+                ASSERT_EQ(std::string(text, format_general(text, value, precision)),
+                          printed(format.c_str(), value));
+            }
+        }
+    }
+}
+
 TEST(FormatFloat, WritesSevenDigits) {
     EXPECT_EQ(formatted_float(16777216.0F), "1.677722e+07");
     EXPECT_EQ(formatted_float(0.1F), "0.1");

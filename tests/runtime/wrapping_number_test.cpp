@@ -47,7 +47,7 @@ TEST(WrappingNumbers, ZerosEqualSingleSteps) {
         wrapping_unsigned many_unsigned = summed<wrapping_unsigned>("7");
         many.append_zeros(count);
         many_unsigned.append_zeros(count);
-        const std::string digits = "7" + std::string(count, '0');
+        const std::string digits = std::string("7").append(count, '0');
         EXPECT_EQ(many.value(), summed<wrapping_int>(digits).value()) << count;
         EXPECT_EQ(many.overflow(), summed<wrapping_int>(digits).overflow()) << count;
         EXPECT_EQ(many_unsigned.value(), summed<wrapping_unsigned>(digits).value()) << count;
