@@ -91,6 +91,12 @@ Bytes RawEntry::Central(std::uint32_t place) const {
            Number32(attributes) + Number32(offset.value_or(place)) + name + centralExtra + comment;
 }
 
+RawArchive RawArchive::Of(std::vector<RawEntry> entries) {
+    RawArchive archive;
+    archive.entries = std::move(entries);
+    return archive;
+}
+
 Bytes RawArchive::Build() const {
     Bytes locals;
     Bytes directory;

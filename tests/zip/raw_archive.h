@@ -66,6 +66,7 @@ struct RawArchive {
     std::optional<std::uint32_t> offset;  ///< else from the end of the stub
     std::optional<std::uint16_t> commentSize;
 
+    static RawArchive Of(std::vector<RawEntry> entries);
     Bytes Build() const;
 };
 
