@@ -1,21 +1,14 @@
-#include "codegen/emit.h"
+#include "codegen/emit_class.h"
 
 namespace vrl_codegen {
 namespace {
-
-bool has_initial_values(const class_plan& made) {
-    for (const member_plan& member : made.members) {
-        if (!member.initial.empty()) return true;
-    }
-    return made.kind == class_kind::root;
-}
 
 /// The operations of a polymorphic class stand in this order in its table of virtual functions.
 void declare_virtual_operations(printer& out, const class_plan& made) {
     const std::string word = made.base.empty() ? "virtual " : "";
     const std::string overrides = made.base.empty() ? "" : " override";
-    out.print(R"(    $virtual$$name$* clone() const$override$;
-    $virtual$~$name$()$override$;
+    out.print(R"(    $virtual$$C$* clone() const$override$;
+    $virtual$~$C$()$override$;
     $virtual$char const* getid() const$override$;
     $virtual$bool has_id(char const* identity) const$override$;
     $virtual$qbxV2::eqbx_error marshal(qbxV2::c_xml_writer& out, char const* name) const$override$;
@@ -25,41 +18,23 @@ void declare_virtual_operations(printer& out, const class_plan& made) {
 }
 
 void declare_own_reading_and_writing(printer& out, const class_plan& made) {
-    if (made.polymorphic && made.kind == class_kind::type) {
+    if (made.has_identity) {
         declare_virtual_operations(out, made);
         return;
     }
     const std::string overrides = made.base.empty() ? "" : " override";
     const std::string marks = made.polymorphic ? " override" : "";
-    out.print(R"(    $virtual$~$name$()$override$;
+    out.print(R"(    $virtual$~$C$()$override$;
     qbxV2::eqbx_error marshal(qbxV2::c_xml_writer& out, char const* name) const$mark$;
     qbxV2::eqbx_error unmarshal(qbxV2::c_xml_reader& reader, std::string const& name)$mark$;
 )",
               {{"virtual", made.base.empty() ? "virtual " : ""}, {"override", overrides}, {"mark", marks}});
 }
 
-void declare_standalone(printer& out) {
-    out.print(R"(
-    /// A document that holds this element alone. The path forms give EQBX_FILE_NOT_OPENED for a file that
-    /// cannot be opened; a failed write to a path deletes the file, one to a text leaves it alone.
-    qbxV2::eqbx_error marshal(std::ostream& os) const;
-    qbxV2::eqbx_error marshal(std::string* text) const;
-    qbxV2::eqbx_error marshal(char const* path) const;
-    /// Reading does not reset the object first.
-    qbxV2::eqbx_error unmarshal(qbxV2::c_xml_reader& reader);
-    qbxV2::eqbx_error unmarshal(std::string const& text);
-    qbxV2::eqbx_error unmarshal(char const* bytes, unsigned length);
-    qbxV2::eqbx_error unmarshal(char const* path);
-    $name$(std::string const& text, qbxV2::eqbx_error* error);
-    $name$(char const* bytes, unsigned length, qbxV2::eqbx_error* error);
-    $name$(char const* path, qbxV2::eqbx_error* error);
-)");
-}
-
 void declare_copying(printer& out) {
-    out.print(R"(    $name$();
-    $name$($name$ const& other);
-    $name$& operator=($name$ const& other);
+    out.print(R"(    $C$();
+    $C$($C$ const& other);
+    $C$& operator=($C$ const& other);
 )");
 }
 
@@ -79,32 +54,31 @@ void declare_entry_points(printer& out) {
 void declare_nil(printer& out, const class_plan& made) {
     out.print(R"(
     /// Whether the element is written as `xsi:nil`, without content.
-    bool isnil_$name$() const;
-    void setnil_$name$();
+    bool isnil_$C$() const;
+    void setnil_$C$();
 )");
-    if (made.kind == class_kind::element && made.text_only) {
+    if (!made.renamed_text.empty()) {
         out.print(R"(    /// The text; setting it clears the nil flag.
-    std::wstring const& get_$name$() const;
-    qbxV2::eqbx_error set_$name$(std::wstring const& value);
-)");
+    $in$ get_$C$() const;
+    qbxV2::eqbx_error set_$C$($in$ value);
+)",
+                  {{"in", made.renamed_text}});
     }
 }
 
 void declare_steps(printer& out, const class_plan& made) {
-    const bool own_attributes = !made.attributes().empty() || made.nillable || made.base.empty();
-    const bool own_content = !made.children().empty() || made.text() != nullptr || made.base.empty();
     out.print("\nprotected:\n    friend struct frame::access;\n");
-    if (own_attributes) {
+    if (made.has_own_attribute_reading()) {
         out.print(
             R"(    bool unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name, qbxV2::eqbx_error* error);
 )");
-        if (!made.nillable || made.base.empty()) {
-            out.print(R"(    qbxV2::eqbx_error unmarshal_attributes_check(qbxV2::c_xml_reader& reader);
+    }
+    if (made.has_own_attributes()) {
+        out.print(R"(    qbxV2::eqbx_error unmarshal_attributes_check(qbxV2::c_xml_reader& reader);
     void marshal_attributes(qbxV2::c_xml_writer& out) const;
 )");
-        }
     }
-    if (own_content) {
+    if (made.has_own_content()) {
         out.print(
             R"(    bool unmarshal_body(qbxV2::c_xml_reader& reader, std::string* name, qbxV2::eqbx_error* error$content$);
     qbxV2::eqbx_error marshal_child_elements(qbxV2::c_xml_writer& out) const;
@@ -115,7 +89,7 @@ void declare_steps(printer& out, const class_plan& made) {
 
 void declare_private(printer& out, const class_plan& made) {
     out.print("\nprivate:\n");
-    if (has_initial_values(made)) out.print("    void init();\n");
+    if (made.has_init()) out.print("    void init();\n");
     if (made.kind == class_kind::choice) {
         out.print("    void choose(eqbx_chosen option);\n    void release_choice();\n");
         out.print("\n    eqbx_chosen m_chosen = chosen_none;\n");
@@ -125,29 +99,29 @@ void declare_private(printer& out, const class_plan& made) {
 }
 
 void declare_full_class(printer& out, const class_plan& made) {
-    out.print("class VRL_API $name$$derives$ {\npublic:\n",
-              {{"derives", made.base.empty() ? "" : " : public " + made.base}});
-    if (made.polymorphic && made.kind == class_kind::type) {
+    out.print(made.base.empty() ? "class VRL_API $C$ {\npublic:\n"
+                                : "class VRL_API $C$ : public $base$ {\npublic:\n");
+    if (made.has_identity) {
         out.print("    /// Identity of this class, compared by pointer.\n    static char const* id;\n\n");
     }
-    if (made.kind == class_kind::choice) declare_choice_state(out, made);
+    if (made.kind == class_kind::choice) declare_choice(out, made);
     declare_copying(out);
     declare_own_reading_and_writing(out, made);
     if (!made.factory.empty()) {
         out.print(
             R"(    /// A new object of the class of this family whose `id` is `type_name`; the caller owns it. Null when
     /// there is none, or when `ns_id` is not the document namespace's.
-    static $name$* factory(int ns_id, std::string const& type_name);
+    static $C$* factory(int ns_id, std::string const& type_name);
 )");
     }
     out.print(R"(
-    void swap($name$& other);
+    void swap($C$& other);
     void reset();
     /// Whether everything that writing demands of this element itself is present.
     bool is_occurs_ok() const;
 )");
-    if (made.standalone) declare_standalone(out);
-    if (made.kind == class_kind::root) declare_entry_points(out);
+    declare_standalone(out, made);
+    if (made.is_document()) declare_entry_points(out);
     for (const member_plan& member : made.members) declare_accessors(out, member);
     if (made.nillable) declare_nil(out, made);
     declare_steps(out, made);
@@ -156,10 +130,10 @@ void declare_full_class(printer& out, const class_plan& made) {
 }
 
 void declare_thin_class(printer& out, const class_plan& made) {
-    out.print("class VRL_API $name$ : public $base$ {\npublic:\n", {{"base", made.base}});
+    out.print("class VRL_API $C$ : public $base$ {\npublic:\n");
     declare_copying(out);
     declare_own_reading_and_writing(out, made);
-    if (made.standalone) declare_standalone(out);
+    declare_standalone(out, made);
     out.print("};\n\n");
 }
 
@@ -178,8 +152,9 @@ std::string emit_module_header(const module_plan& module) {
 #include "V2/frame/storage.h"
 )",
               {{"module", module.name}});
-    for (const std::string& needed : module.depends_on)
+    for (const std::string& needed : module.depends_on) {
         out.print("#include \"V2/$it$.h\"\n", {{"it", needed}});
+    }
     out.print(R"(#include "platform/api.h"
 #include "runtime/values.h"
 #include "runtime/xml_reader.h"
@@ -189,7 +164,7 @@ namespace vrl_v2 {
 
 )");
     for (const class_plan* made : module.classes) {
-        const printer_scope scope(out, {{"name", made->name}});
+        const printer_scope scope(out, {{"C", made->name}, {"base", made->base}});
         out.print(comment(made->documentation, ""));
         if (made->kind == class_kind::group) {
             declare_group(out, *made);

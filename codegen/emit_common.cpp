@@ -1,6 +1,5 @@
 #include "codegen/emit.h"
 #include "codegen/layout.h"
-#include "codegen/plan_members.h"
 
 namespace vrl_codegen {
 
@@ -22,11 +21,16 @@ std::string comment(const std::string& text, const std::string& indent) {
     return text.empty() ? std::string() : lines + line + "\n";
 }
 
-std::string quoted(const std::string& text) { return "\"" + text + "\""; }
+std::string quoted(const std::string& text) {
+    std::string literal = "\"";
+    for (const char c : text) {
+        if (c == '"' || c == '\\') literal.push_back('\\');
+        literal.push_back(c);
+    }
+    return literal.append("\"");
+}
 
-std::string number_of_units(const std::string& text) { return std::to_string(text.size()); }
-
-std::string result_type(const value_plan& value) { return value.parameter; }
+std::string wide_quoted(const std::string& text) { return std::string("L").append(quoted(text)); }
 
 std::string join(const std::vector<std::string>& parts, const std::string& separator) {
     std::string joined;
@@ -37,8 +41,21 @@ std::string join(const std::vector<std::string>& parts, const std::string& separ
     return joined;
 }
 
-std::string enumerator(const std::string& member, const std::string& literal) {
-    return member + "_" + identifier(literal);
+std::string braced(const row_range& names) {
+    return std::string("{")
+        .append(std::to_string(names.first))
+        .append(", ")
+        .append(std::to_string(names.last))
+        .append("}");
+}
+
+void print_row(printer& out, const std::string& namespace_id, const std::string& name,
+               const std::string& token) {
+    out.print("    {$namespace$, \"$name$\", $length$, token::$token$},\n",
+              {{"namespace", namespace_id},
+               {"name", name},
+               {"length", std::to_string(name.size())},
+               {"token", token}});
 }
 
 }  // namespace vrl_codegen

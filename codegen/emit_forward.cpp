@@ -1,12 +1,11 @@
+#include <set>
+
 #include "codegen/emit.h"
 
 namespace vrl_codegen {
 namespace {
 
 constexpr const char k_generated[] = "// Generated from schema/. To change it, change the schema.\n";
-
-// The runtime's own tokens end below this number.
-constexpr unsigned k_first_token = 14;
 
 }  // namespace
 
@@ -33,9 +32,9 @@ namespace vrl_v2::token {
 
 enum : int {
 )");
-    unsigned number = k_first_token;
-    for (const std::string& name : model.tokens) {
-        out.print("    $name$ = $number$,\n", {{"name", name}, {"number", std::to_string(number++)}});
+    for (const token_plan& token : model.tokens) {
+        out.print("    $name$ = $number$,\n",
+                  {{"name", token.name}, {"number", std::to_string(token.number)}});
     }
     out.print("};\n\n}  // namespace vrl_v2::token\n");
     return out.text();
@@ -76,10 +75,11 @@ std::string emit_chief_header(const plan& model) {
 /// Chief header of the document model: every class of the format, and the entry points of `Vrl`.
 
 )");
-    for (const module_plan& module : model.modules) {
-        out.print("#include \"V2/$module$.h\"\n", {{"module", module.name}});
+    std::set<std::string> headers{"document_result"};
+    for (const module_plan& module : model.modules) headers.insert(module.name);
+    for (const std::string& header : headers) {
+        out.print("#include \"V2/$header$.h\"\n", {{"header", header}});
     }
-    out.print("#include \"V2/document_result.h\"\n");
     return out.text();
 }
 

@@ -1,31 +1,27 @@
-#include "codegen/emit.h"
+#include "codegen/emit_class.h"
 
 namespace vrl_codegen {
 namespace {
 
 printer::values holes_of(const group_member_plan& member) {
-    return {{"M", member.element}, {"type", member.class_name}, {"token", member.token}};
+    return {{"M", member.element}, {"type", member.class_name}};
 }
 
 }  // namespace
 
 void declare_group(printer& out, const class_plan& made) {
-    out.print("class VRL_API $name$ {\npublic:\n    enum eqbx_chosen : int {\n");
-    int number = 0;
-    for (const group_member_plan& member : made.group) {
-        out.print("        chosen_$M$ = $number$,\n",
-                  {{"M", member.element}, {"number", std::to_string(number++)}});
-    }
-    out.print(R"(        chosen_none = $none$,
-    };
-    eqbx_chosen getchosen() const { return static_cast<eqbx_chosen>(m_held.state()); }
+    out.print("class VRL_API $C$ {\npublic:\n");
+    std::vector<std::string> names;
+    for (const group_member_plan& member : made.group) names.push_back(member.element);
+    declare_states(out, names, made.none_state);
+    out.print(R"(    eqbx_chosen getchosen() const { return static_cast<eqbx_chosen>(m_held.state()); }
 
-    $name$();
-    $name$($name$ const& other);
-    $name$& operator=($name$ const& other);
-    virtual ~$name$();
+    $C$();
+    $C$($C$ const& other);
+    $C$& operator=($C$ const& other);
+    virtual ~$C$();
 
-    void swap($name$& other);
+    void swap($C$& other);
     void reset();
     bool is_occurs_ok() const;
     /// Writes the held object under its own element's name, whatever `name` is.
@@ -36,8 +32,7 @@ void declare_group(printer& out, const class_plan& made) {
     bool unmarshal(qbxV2::c_xml_reader& reader, std::string* name, qbxV2::eqbx_error* error);
 
     /// A mutable reference, and assigning, make the group hold that member.
-)",
-              {{"none", std::to_string(made.none_state)}});
+)");
     for (const group_member_plan& member : made.group) {
         const printer_scope scope(out, holes_of(member));
         out.print(R"(    $type$ const& get_$M$() const;
@@ -58,25 +53,36 @@ private:
               {{"head", made.head}});
 }
 
-void define_group(printer& out, const class_plan& made) {
-    const printer_scope scope(out, {{"head", made.head}});
+namespace {
+
+void define_group_tables(printer& out, const class_plan& made) {
     out.print("\nnamespace {\n\nconstexpr qbxV2::s_event_map k_$C$_names[] = {\n");
     for (const group_member_plan& member : made.group) {
-        out.print(
-            "    {k_document_namespace_id, \"$M$\", $length$, token::$token$},\n",
-            {{"M", member.element}, {"length", number_of_units(member.element)}, {"token", member.token}});
+        print_row(out, "k_document_namespace_id", member.element, member.token);
     }
     out.print("};\n\nconstexpr frame::group_member<$head$> k_$C$_members[] = {\n");
     for (const group_member_plan& member : made.group) {
-        out.print("    {\"Vrl:$M$\", $maker$},\n",
-                  {{"M", member.element},
-                   {"maker", member.is_head ? std::string("nullptr")
-                                            : "&frame::make<" + made.head + ", " + member.class_name + ">"}});
+        const printer_scope scope(out, holes_of(member));
+        out.print(member.is_head ? "    {\"Vrl:$M$\", nullptr},\n"
+                                 : "    {\"Vrl:$M$\", &frame::make<$head$, $type$>},\n");
     }
-    out.print(R"(};
+    out.print("};\n\n}  // namespace\n");
+}
+
+void define_group_member(printer& out, const group_member_plan& member) {
+    const printer_scope scope(out, holes_of(member));
+    out.print(R"($type$ const& $C$::get_$M$() const { return m_held.as<$type$>(chosen_$M$); }
+$type$& $C$::get_$M$() { return m_held.become<$type$>(chosen_$M$); }
+$type$& $C$::assign_$M$($type$ const& value) { return m_held.assign<$type$>(chosen_$M$, value); }
+)");
+}
 
 }  // namespace
 
+void define_group(printer& out, const class_plan& made) {
+    const printer_scope scope(out, {{"head", made.head}});
+    define_group_tables(out, made);
+    out.print(R"(
 $C$::$C$() : m_held(chosen_none) {}
 $C$::$C$($C$ const& other) : m_held(chosen_none) { m_held.copy_from(other.m_held); }
 $C$& $C$::operator=($C$ const& other) {
@@ -100,13 +106,7 @@ bool $C$::unmarshal(qbxV2::c_xml_reader& reader, std::string* name, qbxV2::eqbx_
     return frame::unmarshal_group(m_held, k_$C$_members, k_$C$_names, reader, name, error, k_source);
 }
 )");
-    for (const group_member_plan& member : made.group) {
-        const printer_scope member_scope(out, holes_of(member));
-        out.print(R"($type$ const& $C$::get_$M$() const { return m_held.as<$type$>(chosen_$M$); }
-$type$& $C$::get_$M$() { return m_held.become<$type$>(chosen_$M$); }
-$type$& $C$::assign_$M$($type$ const& value) { return m_held.assign<$type$>(chosen_$M$, value); }
-)");
-    }
+    for (const group_member_plan& member : made.group) define_group_member(out, member);
 }
 
 }  // namespace vrl_codegen

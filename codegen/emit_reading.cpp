@@ -1,125 +1,85 @@
-#include "codegen/emit.h"
+#include "codegen/emit_class.h"
 
 namespace vrl_codegen {
 namespace {
 
-bool is_group(const member_plan& member) {
-    return member.kind == member_kind::group || member.kind == member_kind::group_list;
-}
-
-std::string range_text(const row_range& names) {
-    return std::string("{")
-        .append(std::to_string(names.first))
-        .append(", ")
-        .append(std::to_string(names.last))
-        .append("}");
-}
-
-void define_attribute_rows(printer& out, const class_plan& made) {
-    if (made.attributes().empty() && !made.nillable) return;
-    out.print("constexpr qbxV2::s_event_map k_$C$_attributes[] = {\n");
-    for (const member_plan* member : made.attributes()) {
-        out.print("    {qbxV2::k_ns_none, \"$X$\", $length$, token::$token$},\n",
-                  {{"X", member->name}, {"length", number_of_units(member->name)}, {"token", member->token}});
-    }
-    if (made.nillable) out.print("    {qbxV2::k_ns_xsi, \"nil\", 3, qbxV2::EQXP_XSI_NIL},\n");
-    out.print("};\n");
-}
-
-void define_child_rows(printer& out, const class_plan& made) {
-    if (made.children().empty() || made.children().front()->kind == member_kind::any_list) return;
-    out.print("constexpr qbxV2::s_event_map k_$C$_children[] = {\n");
-    for (const member_plan* member : made.children()) {
-        if (is_group(*member)) {
-            out.print("    {frame::k_group_row, \"$X$\", 0, 0},\n", {{"X", member->name}});
-        } else {
-            out.print(
-                "    {k_document_namespace_id, \"$X$\", $length$, token::$token$},\n",
-                {{"X", member->name}, {"length", number_of_units(member->name)}, {"token", member->token}});
-        }
-    }
-    out.print("};\nconstexpr frame::names_between k_$C$_next[] = {");
-    std::vector<std::string> ranges;
-    for (const member_plan* member : made.children()) ranges.push_back(range_text(member->next));
-    out.print("$ranges$};\n", {{"ranges", join(ranges, ", ")}});
-}
-
 void define_attribute_reading(printer& out, const class_plan& made) {
-    const bool own = !made.attributes().empty() || made.nillable;
-    if (!own && !made.base.empty()) return;
-    const std::string fallback =
-        made.base.empty() ? "false" : made.base + "::unmarshal_attributes(reader, name, error)";
-    if (!own) {
+    if (!made.has_own_attribute_reading()) return;
+    const std::vector<const member_plan*> attributes = made.attributes();
+    if (attributes.empty() && !made.nillable) {
         out.print(R"(
 bool $C$::unmarshal_attributes(qbxV2::c_xml_reader&, std::string const&, qbxV2::eqbx_error*) { return false; }
 )");
         return;
     }
+    const printer_scope scope(
+        out, {{"inherited",
+               made.base.empty() ? "false" : made.base + "::unmarshal_attributes(reader, name, error)"}});
     out.print(R"(
 bool $C$::unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name, qbxV2::eqbx_error* error) {
     frame::attribute_reader in(reader, name, error, k_source, k_$C$_attributes);
 )");
     if (made.nillable) out.print("    if (in.is_nil()) return in.read_nil(m_nil);\n");
-    if (!made.attributes().empty()) {
-        out.print("    switch (in.which()) {\n");
-        int row = 0;
-        for (const member_plan* member : made.attributes()) {
-            out.print(
-                "        case $row$:\n            return in.read(m_$X$, $limits$);\n",
-                {{"row", std::to_string(row++)}, {"X", member->name}, {"limits", member->value.limits}});
-        }
-        out.print("        default:\n            return $fallback$;\n    }\n}\n", {{"fallback", fallback}});
-    } else {
-        out.print("    return $fallback$;\n}\n", {{"fallback", fallback}});
+    if (attributes.empty()) {
+        out.print("    return $inherited$;\n}\n");
+        return;
     }
+    out.print("    switch (in.which()) {\n");
+    int row = 0;
+    for (const member_plan* member : attributes) {
+        out.print(R"(        case $row$:
+            return in.read(m_$X$, $limits$);
+)",
+                  {{"row", std::to_string(row++)}, {"X", member->name}, {"limits", member->value.limits}});
+    }
+    out.print("        default:\n            return $inherited$;\n    }\n}\n");
 }
 
 void define_attribute_check(printer& out, const class_plan& made) {
-    const bool own = !made.attributes().empty();
-    if (!own && !made.base.empty()) return;
-    std::vector<const member_plan*> required;
-    for (const member_plan* member : made.attributes()) {
-        if (member->required) required.push_back(member);
-    }
+    if (!made.has_own_attributes()) return;
+    const std::vector<const member_plan*> required = made.required_attributes();
     if (required.empty()) {
-        const std::string result =
-            made.base.empty() ? "qbxV2::EQBX_NO_ERROR" : made.base + "::unmarshal_attributes_check(reader)";
-        out.print(R"(
-qbxV2::eqbx_error $C$::unmarshal_attributes_check(qbxV2::c_xml_reader&$reader$) { return $result$; }
-)",
-                  {{"reader", made.base.empty() ? "" : " reader"}, {"result", result}});
+        out.print(made.base.empty() ? R"(
+qbxV2::eqbx_error $C$::unmarshal_attributes_check(qbxV2::c_xml_reader&) { return qbxV2::EQBX_NO_ERROR; }
+)"
+                                    : R"(
+qbxV2::eqbx_error $C$::unmarshal_attributes_check(qbxV2::c_xml_reader& reader) {
+    return $base$::unmarshal_attributes_check(reader);
+}
+)");
         return;
     }
-    out.print(R"(
-qbxV2::eqbx_error $C$::unmarshal_attributes_check(qbxV2::c_xml_reader& reader) {
-    frame::required_attributes check(reader, k_source);
+    out.print("\nqbxV2::eqbx_error $C$::unmarshal_attributes_check(qbxV2::c_xml_reader& reader) {\n");
+    if (made.base_requires_attributes) {
+        out.print(R"(    const qbxV2::eqbx_error missing = $base$::unmarshal_attributes_check(reader);
+    if (missing != qbxV2::EQBX_NO_ERROR) return missing;
 )");
+    }
+    out.print("    frame::required_attributes check(reader, k_source);\n");
     for (const member_plan* member : required) {
         out.print("    check.need(m_$X$, \"$X$\");\n", {{"X", member->name}});
     }
     out.print("    return check.result();\n}\n");
 }
 
-std::string reading_call(const member_plan& member, unsigned row) {
-    const std::string at = std::to_string(row) + ", m_" + member.name;
-    const std::string with_limits = at + ", " + member.value.limits;
-    const bool demanded = member.required && !member.read_optional;
+std::string reading_call(const member_plan& member) {
+    const bool demanded = member.demanded_on_reading();
     switch (member.kind) {
         case member_kind::value:
-            return demanded ? "required(" + with_limits + ")" : "optional(" + with_limits + ")";
+            return demanded ? "required($row$, m_$X$, $limits$)" : "optional($row$, m_$X$, $limits$)";
         case member_kind::object:
-            return demanded ? "required(" + at + ")" : "optional(" + at + ")";
+            return demanded ? "required($row$, m_$X$)" : "optional($row$, m_$X$)";
         case member_kind::value_list:
-            return demanded ? "at_least_one_value(" + with_limits + ")"
-                            : "repeated_values(" + with_limits + ")";
+            return demanded ? "at_least_one_value($row$, m_$X$, $limits$)"
+                            : "repeated_values($row$, m_$X$, $limits$)";
         case member_kind::object_list:
-            return demanded ? "at_least_one(" + at + ")" : "repeated(" + at + ")";
+            return demanded ? "at_least_one($row$, m_$X$)" : "repeated($row$, m_$X$)";
         case member_kind::group:
-            return "group(" + at + ")";
+            return "group($row$, m_$X$)";
         case member_kind::group_list:
-            return "groups(" + at + ")";
+            return "groups($row$, m_$X$)";
         default:
-            return "";
+            return {};
     }
 }
 
@@ -127,9 +87,7 @@ std::string reading_call(const member_plan& member, unsigned row) {
 std::string filled_lists(const class_plan& made) {
     std::vector<std::string> tests;
     for (const member_plan* member : made.children()) {
-        const bool list = member->kind == member_kind::value_list ||
-                          member->kind == member_kind::object_list || member->kind == member_kind::group_list;
-        if (list && member->required) tests.push_back("!m_" + member->name + ".empty()");
+        if (member->is_list() && member->required) tests.push_back("!m_" + member->name + ".empty()");
     }
     return join(tests, " && ");
 }
@@ -152,20 +110,16 @@ bool $C$::unmarshal_body(qbxV2::c_xml_reader& reader, std::string* name, qbxV2::
     in.begin($first$);
     switch (in.which()) {
 )",
-              {{"first", range_text(made.first_names)}});
+              {{"first", braced(made.first_names)}});
     int row = 0;
     for (const member_plan* member : made.children()) {
-        const std::string limits =
-            member->kind == member_kind::value_option ? ", " + member->value.limits : std::string();
-        out.print(R"(        case $row$:
-            choose(chosen_$X$);
-            in.option_$what$(m_$X$.get()$limits$);
-            break;
-)",
-                  {{"row", std::to_string(row++)},
-                   {"X", member->name},
-                   {"what", member->kind == member_kind::value_option ? "value" : "object"},
-                   {"limits", limits}});
+        const bool value = member->kind == member_kind::value_option;
+        const printer_scope scope(
+            out, {{"row", std::to_string(row++)}, {"X", member->name}, {"limits", member->value.limits}});
+        out.print("        case $row$:\n            choose(chosen_$X$);\n");
+        out.print(value ? "            in.option_value(m_$X$.get(), $limits$);\n"
+                        : "            in.option_object(m_$X$.get());\n");
+        out.print("            break;\n");
     }
     out.print(R"(        default:
             in.no_option();
@@ -187,19 +141,18 @@ bool $C$::unmarshal_body(qbxV2::c_xml_reader& reader, std::string* name, qbxV2::
 }
 
 void define_children_body(printer& out, const class_plan& made) {
+    const printer_scope scope(out, {{"first", braced(made.first_names)}});
     out.print(R"(
 bool $C$::unmarshal_body(qbxV2::c_xml_reader& reader, std::string* name, qbxV2::eqbx_error* error) {
 )");
-    if (!made.base.empty()) {
-        out.print("    if (!$base$::unmarshal_body(reader, name, error)) return false;\n",
-                  {{"base", made.base}});
-    }
+    if (!made.base.empty())
+        out.print("    if (!$base$::unmarshal_body(reader, name, error)) return false;\n");
     out.print("    frame::children_reader in(reader, name, error, k_source, k_$C$_children, k_$C$_next);\n");
-    out.print("    in.$begin$($first$);\n", {{"begin", made.base.empty() ? "begin" : "begin_derived"},
-                                             {"first", range_text(made.first_names)}});
-    unsigned row = 0;
+    out.print(made.base.empty() ? "    in.begin($first$);\n" : "    in.begin_derived($first$);\n");
+    int row = 0;
     for (const member_plan* member : made.children()) {
-        out.print("    in.$call$;\n", {{"call", reading_call(*member, row++)}});
+        out.print("    in." + reading_call(*member) + ";\n",
+                  {{"row", std::to_string(row++)}, {"X", member->name}, {"limits", member->value.limits}});
     }
     const std::string filled = filled_lists(made);
     if (!filled.empty()) {
@@ -209,27 +162,34 @@ bool $C$::unmarshal_body(qbxV2::c_xml_reader& reader, std::string* name, qbxV2::
     out.print("    return in.done();\n}\n");
 }
 
-}  // namespace
-
-void define_tables(printer& out, const class_plan& made) {
-    if (made.kind == class_kind::group || !made.declares_members) return;
-    define_attribute_rows(out, made);
-    define_child_rows(out, made);
+void define_body(printer& out, const class_plan& made) {
+    switch (made.content) {
+        case content_kind::text:
+            define_text_body(out, made);
+            break;
+        case content_kind::children:
+            define_children_body(out, made);
+            break;
+        case content_kind::choice:
+            define_choice_body(out, made);
+            break;
+        case content_kind::any:
+            define_any_body(out);
+            break;
+        case content_kind::none:
+            out.print(R"(
+bool $C$::unmarshal_body(qbxV2::c_xml_reader&, std::string*, qbxV2::eqbx_error*) { return true; }
+)");
+            break;
+    }
 }
+
+}  // namespace
 
 void define_reading(printer& out, const class_plan& made) {
     define_attribute_reading(out, made);
-    if (!made.nillable || made.base.empty()) define_attribute_check(out, made);
-    const auto children = made.children();
-    if (made.text() != nullptr) {
-        define_text_body(out, made);
-    } else if (made.kind == class_kind::choice) {
-        define_choice_body(out, made);
-    } else if (!children.empty() && children.front()->kind == member_kind::any_list) {
-        define_any_body(out);
-    } else if (!children.empty()) {
-        define_children_body(out, made);
-    }
+    define_attribute_check(out, made);
+    if (made.has_own_content()) define_body(out, made);
 }
 
 }  // namespace vrl_codegen

@@ -250,7 +250,9 @@ std::string lay_out(const std::string& text) {
         out.put(text.substr(from, end - from));
         from = end + 1;
     }
-    return out.take();
+    std::string laid_out = out.take();
+    if (!text.empty() && text.back() != '\n') laid_out.pop_back();
+    return laid_out;
 }
 
 }  // namespace vrl_codegen

@@ -3,6 +3,7 @@
 #include <fstream>
 #include <iostream>
 #include <sstream>
+#include <stdexcept>
 
 #include "codegen/class_plan.h"
 #include "codegen/emit.h"
@@ -17,7 +18,9 @@ void write_if_changed(const std::filesystem::path& path, const std::string& text
     present << old.rdbuf();
     if (old.is_open() && present.str() == text) return;
     std::filesystem::create_directories(path.parent_path());
-    std::ofstream(path, std::ios::binary) << text;
+    std::ofstream file(path, std::ios::binary);
+    file << text << std::flush;
+    if (!file) throw std::runtime_error("cannot write " + path.string());
 }
 
 void generate(const std::string& schema_path, const std::filesystem::path& out) {
@@ -32,7 +35,7 @@ void generate(const std::string& schema_path, const std::filesystem::path& out) 
     write_if_changed(out / "driver" / "classes.cpp", emit_driver_list(model));
     for (const module_plan& module : model.modules) {
         write_if_changed(v2 / (module.name + ".h"), emit_module_header(module));
-        write_if_changed(v2 / (module.name + ".cpp"), emit_module_source(model, module));
+        write_if_changed(v2 / (module.name + ".cpp"), emit_module_source(module));
         write_if_changed(out / "driver" / (module.name + ".cpp"), emit_driver(module));
     }
 }

@@ -2,9 +2,11 @@
 
 namespace vrl_codegen {
 
-std::string token_table::add(const std::string& token) {
-    if (m_known.emplace(token, true).second) m_names.push_back(token);
-    return token;
+std::string token_table::add(const std::string& name) {
+    if (m_known.insert(name).second) {
+        m_tokens.push_back({name, k_first_token + static_cast<unsigned>(m_tokens.size())});
+    }
+    return name;
 }
 
 }  // namespace vrl_codegen

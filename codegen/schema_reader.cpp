@@ -2,22 +2,77 @@
 
 #include <algorithm>
 #include <set>
+#include <utility>
 
+#include "codegen/schema_grammar.h"
 #include "codegen/xml_dom.h"
 
 namespace vrl_codegen {
 namespace {
 
-constexpr const char k_xs[] = "http://www.w3.org/2001/XMLSchema";
-constexpr const char k_annotations[] = "urn:vrl:codegen";
+bool is(const xmlNode* node, const char* name) { return local_name(node) == name; }
 
+const xmlNode* child(const xmlNode* node, const char* name) {
+    for (const xmlNode* found : child_elements(node)) {
+        if (is(found, name)) return found;
+    }
+    return nullptr;
+}
+
+void read_notes(const xmlNode* appinfo, annotations& notes) {
+    for (const xmlNode* note : child_elements(appinfo)) {
+        notes[local_name(note)] = attribute(note, has_attribute(note, "name") ? "name" : "value");
+    }
+}
+
+void read_annotation(const xmlNode* node, annotations& notes, std::string& documentation) {
+    for (const xmlNode* annotation : child_elements(node)) {
+        if (!is(annotation, "annotation")) continue;
+        for (const xmlNode* part : child_elements(annotation)) {
+            if (is(part, "appinfo")) {
+                read_notes(part, notes);
+            } else {
+                if (!documentation.empty()) documentation += ' ';
+                documentation += folded_text(part);
+            }
+        }
+    }
+}
+
+/// A bound takes the place of the one that was inherited on its side, be it open or closed.
+void set_bound(std::optional<std::string>& bound, std::optional<std::string>& other,
+               const std::string& value) {
+    bound = value;
+    other.reset();
+}
+
+void read_facet(const xmlNode* node, facets& limits) {
+    const std::string value = attribute(node, "value");
+    const auto number = [node, &value] {
+        if (value.size() > 9) throw schema_error(node, "a length of " + value + " is beyond all texts");
+        return static_cast<unsigned>(std::stoul(value));
+    };
+    if (is(node, "minInclusive")) set_bound(limits.min_inclusive, limits.min_exclusive, value);
+    if (is(node, "minExclusive")) set_bound(limits.min_exclusive, limits.min_inclusive, value);
+    if (is(node, "maxInclusive")) set_bound(limits.max_inclusive, limits.max_exclusive, value);
+    if (is(node, "maxExclusive")) set_bound(limits.max_exclusive, limits.max_inclusive, value);
+    if (is(node, "minLength") || is(node, "length")) limits.min_length = number();
+    if (is(node, "maxLength") || is(node, "length")) limits.max_length = number();
+    if (is(node, "enumeration")) limits.enumeration.push_back(value);
+    if (is(node, "pattern")) limits.has_pattern = true;
+}
+
+/// Leans on the two checks ahead of it: what is read here is valid and known.
 class reader {
 public:
     schema read(const std::string& path) {
         load(path);
+        check_is_schema(path);
         for (const auto& [module, doc] : m_documents) {
-            for (const xmlNode* node : child_elements(root_of(doc))) read_global(module, node);
+            m_module = module;
+            for (const xmlNode* node : child_elements(root_of(doc))) read_global(node);
         }
+        resolve_references();
         return std::move(m_schema);
     }
 
@@ -28,274 +83,183 @@ private:
         const std::string module = file.substr(0, file.find('.'));
         if (!m_seen.insert(module).second) return;
         document doc = parse_file(path);
+        check_is_known(doc);
         const xmlNode* root = root_of(doc);
-        if (!is_xs(root, "schema")) throw schema_error(root, "expected xs:schema");
         m_schema.target_namespace = attribute(root, "targetNamespace");
         for (const xmlNode* node : child_elements(root)) {
-            if (is_xs(node, "include")) load(folder + attribute(node, "schemaLocation"));
-            if (is_xs(node, "simpleType")) m_simple_types[attribute(node, "name")] = node;
+            if (is(node, "include")) load(folder + attribute(node, "schemaLocation"));
+            if (is(node, "simpleType")) m_simple_types[attribute(node, "name")] = node;
         }
-        m_schema.modules.push_back(module);
+        annotations none;
+        schema_module read{module, std::string()};
+        read_annotation(root, none, read.documentation);
+        m_schema.modules.push_back(std::move(read));
         m_documents.emplace_back(module, std::move(doc));
     }
 
-    static bool is_xs(const xmlNode* node, const char* name) {
-        return namespace_of(node) == k_xs && local_name(node) == name;
+    void read_global(const xmlNode* node) {
+        if (is(node, "simpleType"))
+            m_schema.simple_types.push_back(read_simple_type(node, attribute(node, "name")));
+        if (is(node, "complexType")) read_complex_type(node, attribute(node, "name"), std::string());
+        if (is(node, "element")) read_global_element(node);
     }
 
-    void read_global(const std::string& module, const xmlNode* node) {
-        if (is_xs(node, "include") || is_xs(node, "simpleType") || is_xs(node, "annotation")) return;
-        if (is_xs(node, "complexType")) {
-            read_complex_type(module, node, attribute(node, "name"));
-        } else if (is_xs(node, "element")) {
-            read_global_element(module, node);
-        } else {
-            throw schema_error(node, "unknown declaration xs:" + local_name(node));
-        }
-    }
-
-    void read_global_element(const std::string& module, const xmlNode* node) {
+    void read_global_element(const xmlNode* node) {
         global_element element;
         element.name = attribute(node, "name");
-        element.module = module;
-        element.type_key = without_prefix(attribute(node, "type"));
+        element.module = m_module;
+        element.place = place_of(node);
         element.substitution_group = without_prefix(attribute(node, "substitutionGroup"));
         element.is_abstract = attribute(node, "abstract") == "true";
         element.nillable = attribute(node, "nillable") == "true";
         read_annotation(node, element.notes, element.documentation);
-        for (const xmlNode* child : child_elements(node)) {
-            if (!is_xs(child, "complexType")) continue;
+        if (const xmlNode* type = child(node, "complexType")) {
             element.anonymous = true;
-            element.type_key = "/" + element.name;
-            complex_type& type = read_complex_type(module, child, std::string(), element.type_key);
-            type.element_name = element.name;
+            element.type_key = read_complex_type(type, std::string(), "/" + element.name);
+        } else if (is_complex(node)) {
+            element.type_key = without_prefix(attribute(node, "type"));
+        } else {
+            throw schema_error(node, "the global element " + element.name + " needs a complex type");
         }
-        if (element.type_key.empty()) throw schema_error(node, "a global element needs a type");
         m_schema.elements.push_back(std::move(element));
     }
 
-    complex_type& read_complex_type(const std::string& module, const xmlNode* node, const std::string& name,
-                                    const std::string& key = std::string()) {
+    /// Gives the key of the type.
+    std::string read_complex_type(const xmlNode* node, const std::string& name, const std::string& key) {
         complex_type type;
         type.name = name;
         type.key = name.empty() ? key : name;
-        type.module = module;
+        type.element_name = key.substr(key.find_last_of('/') + 1);
+        type.module = m_module;
+        type.place = place_of(node);
         type.is_abstract = attribute(node, "abstract") == "true";
         read_annotation(node, type.notes, type.documentation);
-        read_content(module, node, type);
+        read_content(node, type);
         m_schema.types.push_back(std::move(type));
-        return m_schema.types.back();
+        return m_schema.types.back().key;
     }
 
-    void read_content(const std::string& module, const xmlNode* node, complex_type& type) {
-        for (const xmlNode* child : child_elements(node)) {
-            if (is_xs(child, "annotation")) continue;
-            if (is_xs(child, "attribute")) {
-                type.attributes.push_back(read_attribute(child));
-            } else if (is_xs(child, "sequence") || is_xs(child, "choice")) {
-                type.kind =
-                    is_xs(child, "choice") ? complex_type::content::choice : complex_type::content::sequence;
-                for (const xmlNode* particle : child_elements(child)) {
-                    if (is_xs(particle, "annotation")) continue;
-                    type.elements.push_back(read_particle(module, particle, type));
-                }
-            } else if (is_xs(child, "complexContent")) {
-                read_extension(module, child, type);
-            } else if (is_xs(child, "simpleContent")) {
+    void read_content(const xmlNode* node, complex_type& type) {
+        for (const xmlNode* part : child_elements(node)) {
+            if (is(part, "attribute")) type.attributes.push_back(read_attribute(part));
+            if (is(part, "sequence")) read_particles(part, complex_type::content::sequence, type);
+            if (is(part, "choice")) read_particles(part, complex_type::content::choice, type);
+            if (is(part, "complexContent")) {
+                const xmlNode* extension = child(part, "extension");
+                type.base = without_prefix(attribute(extension, "base"));
+                read_content(extension, type);
+            }
+            if (is(part, "simpleContent")) {
+                const xmlNode* extension = child(part, "extension");
                 type.kind = complex_type::content::simple;
-                read_extension(module, child, type);
-            } else {
-                throw schema_error(child, "unknown content xs:" + local_name(child));
+                type.text = resolve_simple(extension, attribute(extension, "base"));
+                read_content(extension, type);
             }
         }
     }
 
-    void read_extension(const std::string& module, const xmlNode* node, complex_type& type) {
-        for (const xmlNode* extension : child_elements(node)) {
-            if (is_xs(extension, "annotation")) continue;
-            if (!is_xs(extension, "extension")) throw schema_error(extension, "only xs:extension is known");
-            const std::string base = attribute(extension, "base");
-            if (is_xs(node, "simpleContent")) {
-                type.text = resolve_simple(extension, base);
-            } else {
-                type.base = without_prefix(base);
-            }
-            read_content(module, extension, type);
+    void read_particles(const xmlNode* node, complex_type::content kind, complex_type& type) {
+        type.kind = kind;
+        for (const xmlNode* particle : child_elements(node)) {
+            type.elements.push_back(read_particle(particle, type));
         }
     }
 
-    element_declaration read_particle(const std::string& module, const xmlNode* node,
-                                      const complex_type& owner) {
+    element_declaration read_particle(const xmlNode* node, const complex_type& owner) {
         element_declaration element;
+        element.place = place_of(node);
         read_annotation(node, element.notes, element.documentation);
-        if (has_attribute(node, "minOccurs")) {
-            element.min_occurs = static_cast<unsigned>(std::stoul(attribute(node, "minOccurs")));
-        }
-        if (has_attribute(node, "maxOccurs")) {
-            const std::string most = attribute(node, "maxOccurs");
-            if (most != "unbounded" && most != "1") throw schema_error(node, "maxOccurs is 1 or unbounded");
-            element.repeated = most == "unbounded";
-        }
-        if (element.min_occurs > 1) throw schema_error(node, "minOccurs is 0 or 1");
-        if (is_xs(node, "any")) {
+        element.min_occurs = attribute(node, "minOccurs") == "0" ? 0 : 1;
+        element.repeated = attribute(node, "maxOccurs") == "unbounded";
+        element.nillable = attribute(node, "nillable") == "true";
+        if (is(node, "any")) {
             element.name = "any";
             element.kind = element_declaration::form::any;
-        } else if (is_xs(node, "element")) {
-            read_local_element(module, node, owner, element);
+        } else if (has_attribute(node, "ref")) {
+            element.kind = element_declaration::form::reference;
+            element.name = without_prefix(attribute(node, "ref"));
         } else {
-            throw schema_error(node, "unknown particle xs:" + local_name(node));
+            element.name = attribute(node, "name");
+            read_type_of_element(node, owner, element);
         }
         return element;
     }
 
-    void read_local_element(const std::string& module, const xmlNode* node, const complex_type& owner,
-                            element_declaration& element) {
-        element.nillable = attribute(node, "nillable") == "true";
-        if (has_attribute(node, "ref")) {
-            element.kind = element_declaration::form::reference;
-            element.name = without_prefix(attribute(node, "ref"));
-            return;
-        }
-        element.name = attribute(node, "name");
-        if (has_attribute(node, "type")) {
-            const std::string type = attribute(node, "type");
-            if (is_simple(node, type)) {
-                element.simple = resolve_simple(node, type);
-            } else {
-                element.kind = element_declaration::form::named_type;
-                element.type_name = without_prefix(type);
-            }
-            return;
-        }
-        for (const xmlNode* child : child_elements(node)) {
-            if (is_xs(child, "simpleType")) element.simple = read_simple_type(child, std::string());
-            if (is_xs(child, "complexType")) {
-                element.kind = element_declaration::form::anonymous_type;
-                element.anonymous_type_key = owner.key + "/" + element.name;
-                complex_type& type =
-                    read_complex_type(module, child, std::string(), element.anonymous_type_key);
-                type.element_name = element.name;
-            }
-        }
-        if (element.kind == element_declaration::form::simple && element.simple.built_in.empty()) {
-            throw schema_error(node, "the element " + element.name + " has no type");
+    void read_type_of_element(const xmlNode* node, const complex_type& owner, element_declaration& element) {
+        if (const xmlNode* type = child(node, "complexType")) {
+            element.kind = element_declaration::form::anonymous_type;
+            element.type_key = read_complex_type(type, std::string(), owner.key + "/" + element.name);
+        } else if (is_complex(node)) {
+            element.kind = element_declaration::form::named_type;
+            element.type_key = without_prefix(attribute(node, "type"));
+        } else {
+            element.simple = simple_type_of(node);
         }
     }
 
     attribute_declaration read_attribute(const xmlNode* node) {
         attribute_declaration declared;
         declared.name = attribute(node, "name");
+        declared.place = place_of(node);
         declared.required = attribute(node, "use") == "required";
         if (has_attribute(node, "default")) declared.default_value = attribute(node, "default");
         read_annotation(node, declared.notes, declared.documentation);
-        if (has_attribute(node, "type")) {
-            declared.type = resolve_simple(node, attribute(node, "type"));
-        } else {
-            for (const xmlNode* child : child_elements(node)) {
-                if (is_xs(child, "simpleType")) declared.type = read_simple_type(child, std::string());
-            }
-        }
-        if (declared.type.built_in.empty()) throw schema_error(node, "an attribute needs a simple type");
+        declared.type = simple_type_of(node);
         return declared;
     }
 
-    static std::string namespace_of_name(const xmlNode* node, const std::string& qualified) {
-        const std::size_t colon = qualified.find(':');
-        const std::string prefix = colon == std::string::npos ? std::string() : qualified.substr(0, colon);
-        const xmlNs* found =
-            xmlSearchNs(node->doc, const_cast<xmlNode*>(node),
-                        prefix.empty() ? nullptr : reinterpret_cast<const xmlChar*>(prefix.c_str()));
-        return found == nullptr ? std::string() : reinterpret_cast<const char*>(found->href);
+    /// Whether the attribute `type` names a complex type, which may be read later.
+    bool is_complex(const xmlNode* node) const {
+        const std::string type = attribute(node, "type");
+        return !type.empty() && namespace_of_name(node, type) != k_xs_namespace &&
+               m_simple_types.count(without_prefix(type)) == 0;
     }
 
-    bool is_simple(const xmlNode* node, const std::string& type) const {
-        return namespace_of_name(node, type) == k_xs || m_simple_types.count(without_prefix(type)) != 0;
+    simple_type simple_type_of(const xmlNode* node) {
+        if (const xmlNode* type = child(node, "simpleType")) return read_simple_type(type, std::string());
+        if (has_attribute(node, "type")) return resolve_simple(node, attribute(node, "type"));
+        throw schema_error(node, attribute(node, "name") + " has no type");
     }
 
     simple_type resolve_simple(const xmlNode* node, const std::string& type) {
         const std::string name = without_prefix(type);
-        if (namespace_of_name(node, type) == k_xs) {
-            simple_type built_in;
-            built_in.built_in = name;
-            return built_in;
+        if (namespace_of_name(node, type) != k_xs_namespace) {
+            const auto found = m_simple_types.find(name);
+            if (found == m_simple_types.end()) throw schema_error(node, name + " is no simple type");
+            return read_simple_type(found->second, name);
         }
-        const auto found = m_simple_types.find(name);
-        if (found == m_simple_types.end()) throw schema_error(node, "no simple type " + type);
-        return read_simple_type(found->second, name);
+        simple_type built_in;
+        built_in.built_in = name;
+        return built_in;
     }
 
     simple_type read_simple_type(const xmlNode* node, const std::string& name) {
-        for (const xmlNode* restriction : child_elements(node)) {
-            if (is_xs(restriction, "annotation")) continue;
-            if (!is_xs(restriction, "restriction")) {
-                throw schema_error(restriction, "only xs:restriction is known");
-            }
-            simple_type type = resolve_simple(restriction, attribute(restriction, "base"));
-            type.name = name;
-            annotations unused;
-            read_annotation(node, unused, type.documentation);
-            for (const xmlNode* facet : child_elements(restriction)) read_facet(facet, type.limits);
-            return type;
-        }
-        throw schema_error(node, "a simple type needs a restriction");
+        const xmlNode* restriction = child(node, "restriction");
+        simple_type type = resolve_simple(restriction, attribute(restriction, "base"));
+        type.name = name;
+        type.module = m_module;
+        annotations none;
+        std::string documentation;
+        read_annotation(node, none, documentation);
+        if (!documentation.empty()) type.documentation = documentation;
+        // Literals of the base are those that are left over: the restriction lists all that it still allows.
+        if (child(restriction, "enumeration") != nullptr) type.limits.enumeration.clear();
+        for (const xmlNode* facet : child_elements(restriction)) read_facet(facet, type.limits);
+        return type;
     }
 
-    static void read_facet(const xmlNode* node, facets& limits) {
-        const std::string name = local_name(node);
-        const std::string value = attribute(node, "value");
-        if (name == "minInclusive") {
-            limits.min_inclusive = value;
-        } else if (name == "minExclusive") {
-            limits.min_exclusive = value;
-        } else if (name == "maxInclusive") {
-            limits.max_inclusive = value;
-        } else if (name == "maxExclusive") {
-            limits.max_exclusive = value;
-        } else if (name == "minLength") {
-            limits.min_length = static_cast<unsigned>(std::stoul(value));
-        } else if (name == "maxLength") {
-            limits.max_length = static_cast<unsigned>(std::stoul(value));
-        } else if (name == "length") {
-            limits.min_length = limits.max_length = static_cast<unsigned>(std::stoul(value));
-        } else if (name == "enumeration") {
-            limits.enumeration.push_back(value);
-        } else if (name == "pattern") {
-            limits.has_pattern = true;
-        } else {
-            throw schema_error(node, "unknown facet xs:" + name);
-        }
-    }
-
-    static void read_annotation(const xmlNode* node, annotations& notes, std::string& documentation) {
-        for (const xmlNode* annotation : child_elements(node)) {
-            if (!is_xs(annotation, "annotation")) continue;
-            for (const xmlNode* part : child_elements(annotation)) {
-                if (is_xs(part, "documentation")) {
-                    if (!documentation.empty()) documentation += ' ';
-                    documentation += folded_text(part);
-                } else if (is_xs(part, "appinfo")) {
-                    read_notes(part, notes);
-                }
+    void resolve_references() {
+        for (complex_type& type : m_schema.types) {
+            for (element_declaration& element : type.elements) {
+                if (element.kind != element_declaration::form::reference) continue;
+                const global_element& referred = *m_schema.find_element(element.name);
+                element.type_key = referred.type_key;
             }
-        }
-    }
-
-    static void read_notes(const xmlNode* appinfo, annotations& notes) {
-        static const std::set<std::string> known = {
-            "polymorphic",    "class",   "owned",    "read-optional", "no-presence", "no-standalone",
-            "always-written", "initial", "empty-ok", "optional-text", "document"};
-        for (const xmlNode* note : child_elements(appinfo)) {
-            const std::string name = local_name(note);
-            if (namespace_of(note) != k_annotations || known.count(name) == 0) {
-                throw schema_error(note, "unknown annotation " + name);
-            }
-            const std::string value =
-                has_attribute(note, "name") ? attribute(note, "name") : attribute(note, "value");
-            notes[name] = value;
         }
     }
 
     schema m_schema;
+    std::string m_module;
     std::set<std::string> m_seen;
     std::vector<std::pair<std::string, document>> m_documents;
     std::map<std::string, const xmlNode*> m_simple_types;
@@ -313,6 +277,11 @@ const global_element* schema::find_element(const std::string& name) const {
     const auto found = std::find_if(elements.begin(), elements.end(),
                                     [&name](const global_element& element) { return element.name == name; });
     return found == elements.end() ? nullptr : &*found;
+}
+
+bool schema::is_head(const std::string& name) const {
+    return std::any_of(elements.begin(), elements.end(),
+                       [&name](const global_element& element) { return element.substitution_group == name; });
 }
 
 schema read_schema(const std::string& path) { return reader().read(path); }

@@ -6,8 +6,8 @@
 
 namespace vrl_codegen {
 
-/// Reads a schema document and all that it includes. Throws `schema_error` on anything that the compiler
-/// doesn't know: a construct that is passed over in silence would be a hole in the model.
+/// Reads a schema document and all that it includes. Throws `schema_error`, with file and line, when it is no
+/// valid XML Schema or uses anything that the compiler doesn't know.
 schema read_schema(const std::string& path);
 
 }  // namespace vrl_codegen

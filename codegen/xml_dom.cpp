@@ -9,11 +9,6 @@ std::string text_of(const xmlChar* text) {
     return text == nullptr ? std::string() : std::string(reinterpret_cast<const char*>(text));
 }
 
-std::string place_of(const xmlNode* node) {
-    std::string file = node->doc != nullptr ? text_of(node->doc->URL) : std::string();
-    return file.substr(file.find_last_of('/') + 1) + ":" + std::to_string(xmlGetLineNo(node));
-}
-
 std::string take(xmlChar* text) {
     std::string copy = text_of(text);
     xmlFree(text);
@@ -25,13 +20,24 @@ const xmlChar* as_xml(const char* text) { return reinterpret_cast<const xmlChar*
 }  // namespace
 
 schema_error::schema_error(const xmlNode* where, const std::string& what)
-    : std::runtime_error(place_of(where) + ": " + what) {}
+    : schema_error(place_of(where), what) {}
+
+schema_error::schema_error(const std::string& place, const std::string& what)
+    : std::runtime_error(place + ": " + what) {}
+
+void complaint::note(const char* file, long line, const char* message) {
+    if (!what.empty()) return;
+    place = place_of(file != nullptr ? file : path, line);
+    what = message != nullptr ? message : "cannot be read";
+    what.erase(what.find_last_not_of('\n') + 1);
+}
 
 document parse_file(const std::string& path) {
+    complaint first{path, std::string(), std::string()};
+    xmlSetStructuredErrorFunc(&first, note_complaint);
     document doc(xmlReadFile(path.c_str(), nullptr, XML_PARSE_NONET));
-    if (!doc || xmlDocGetRootElement(doc.get()) == nullptr) {
-        throw schema_error(path + ": cannot be read as XML");
-    }
+    xmlSetStructuredErrorFunc(nullptr, nullptr);
+    if (doc == nullptr) throw schema_error(first.place, first.what);
     return doc;
 }
 
@@ -42,6 +48,12 @@ std::string local_name(const xmlNode* node) { return text_of(node->name); }
 std::string namespace_of(const xmlNode* node) {
     return node->ns == nullptr ? std::string() : text_of(node->ns->href);
 }
+
+std::string place_of(const std::string& path, long line) {
+    return path.substr(path.find_last_of('/') + 1).append(":").append(std::to_string(line));
+}
+
+std::string place_of(const xmlNode* node) { return place_of(text_of(node->doc->URL), xmlGetLineNo(node)); }
 
 bool has_attribute(const xmlNode* node, const char* name) {
     return xmlHasProp(node, as_xml(name)) != nullptr;
@@ -76,5 +88,13 @@ std::string folded_text(const xmlNode* node) {
 }
 
 std::string without_prefix(const std::string& qualified) { return qualified.substr(qualified.find(':') + 1); }
+
+std::string namespace_of_name(const xmlNode* node, const std::string& qualified) {
+    const std::size_t colon = qualified.find(':');
+    const std::string prefix = colon == std::string::npos ? std::string() : qualified.substr(0, colon);
+    const xmlNs* found =
+        xmlSearchNs(node->doc, const_cast<xmlNode*>(node), prefix.empty() ? nullptr : as_xml(prefix.c_str()));
+    return found == nullptr ? std::string() : text_of(found->href);
+}
 
 }  // namespace vrl_codegen

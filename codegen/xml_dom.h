@@ -14,7 +14,24 @@ namespace vrl_codegen {
 class schema_error : public std::runtime_error {
 public:
     schema_error(const xmlNode* where, const std::string& what);
-    explicit schema_error(const std::string& what) : std::runtime_error(what) {}
+    /// `place` is "file:line".
+    schema_error(const std::string& place, const std::string& what);
+};
+
+/// The first error that libxml2 reports about a file; those behind it mostly follow from it.
+struct complaint {
+    std::string path;  ///< of the file, where libxml2 doesn't name one
+    std::string place;
+    std::string what;
+
+    /// Any of the texts may be null.
+    void note(const char* file, long line, const char* message);
+};
+
+/// A handler of structured errors with a `complaint` as its context. Generic, as the constness of the error
+/// differs between versions of libxml2.
+inline constexpr auto note_complaint = [](void* context, auto* error) {
+    static_cast<complaint*>(context)->note(error->file, error->line, error->message);
 };
 
 struct document_deleter {
@@ -28,6 +45,9 @@ document parse_file(const std::string& path);
 const xmlNode* root_of(const document& doc);
 std::string local_name(const xmlNode* node);
 std::string namespace_of(const xmlNode* node);
+/// "file:line", without the folder.
+std::string place_of(const xmlNode* node);
+std::string place_of(const std::string& path, long line);
 bool has_attribute(const xmlNode* node, const char* name);
 /// Empty when absent.
 std::string attribute(const xmlNode* node, const char* name);
@@ -36,5 +56,7 @@ std::vector<const xmlNode*> child_elements(const xmlNode* node);
 std::string folded_text(const xmlNode* node);
 /// The part of a qualified name behind the colon.
 std::string without_prefix(const std::string& qualified);
+/// The namespace that a qualified name in an attribute of `node` stands for; empty for none.
+std::string namespace_of_name(const xmlNode* node, const std::string& qualified);
 
 }  // namespace vrl_codegen

@@ -34,7 +34,7 @@ const layout_case k_lines[] = {
     stays("a blank line", "a\n\nb\n"),
     stays("nothing", ""),
     {"doubled blank lines become one", "a\n\n\n\nb\n", "a\n\nb\n"},
-    {"the last line gets an end", "a", "a\n"},
+    stays("a last line without an end", "a\nb"),
 };
 INSTANTIATE_TEST_SUITE_P(Lines, Layout, testing::ValuesIn(k_lines));
 
