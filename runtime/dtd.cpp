@@ -8,6 +8,7 @@ namespace qbxV2 {
 using detail::is_space;
 
 bool c_dtd_util::select_parameter_entity() {
+    const c_get_with_entities::c_reference reference(m_getter);
     c_entity_name_reader_for_c_get reader(m_getter, false);
     std::string name;
     detail::read_reference_name(reader, reader.get(), &name);

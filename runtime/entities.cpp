@@ -53,12 +53,14 @@ void c_get_with_entities::define(entity_table* table, const char* name, const ch
 
 /// The table is about to free a text that is still being read: the frame goes on with a copy.
 void c_get_with_entities::keep_text(s_frame* frame) {
+    const bool is_read_out = *frame->cursor == '\0';
     const std::size_t size = std::strlen(frame->start) + 1;
     std::unique_ptr<char[]> copy(new char[size]);
     std::memcpy(copy.get(), frame->start, size);
     m_open.erase(frame->start);
     m_open.insert(copy.get());
-    frame->cursor = copy.get() + (frame->cursor - frame->start);
+    frame->cursor =
+        copy.get() + (is_read_out ? static_cast<std::ptrdiff_t>(size - 1) : frame->cursor - frame->start);
     frame->start = copy.get();
     m_kept_texts.push_back(std::move(copy));
 }
@@ -66,6 +68,10 @@ void c_get_with_entities::keep_text(s_frame* frame) {
 bool c_get_with_entities::set_input_entity_value(const char* value) {
     if (m_open.count(value) != 0) return refuse_recursion(value);
     if (!admit_entity_text(value)) return false;
+    // What ended while the reference was read lies beneath what it refers to, with nothing left to read.
+    for (; !m_ended_in_reference.empty(); m_ended_in_reference.pop_back()) {
+        m_frames.push_back(s_frame{"", m_ended_in_reference.back(), c_unget_buffer()});
+    }
     m_frames.push_back(s_frame{value, value, c_unget_buffer()});
     m_open.insert(value);
     block_runs(block_entity, true);
@@ -73,11 +79,23 @@ bool c_get_with_entities::set_input_entity_value(const char* value) {
 }
 
 void c_get_with_entities::close_frame() {
-    m_open.erase(m_frames.back().start);
+    const char* const start = m_frames.back().start;
     m_frames.pop_back();
+    if (m_in_reference) {
+        m_ended_in_reference.push_back(start);
+    } else {
+        m_open.erase(start);
+    }
     if (!m_frames.empty()) return;
-    m_kept_texts.clear();
+    if (!m_in_reference) m_kept_texts.clear();
     block_runs(block_entity, false);
+}
+
+void c_get_with_entities::end_reference() {
+    m_in_reference = false;
+    for (const char* const start : m_ended_in_reference) m_open.erase(start);
+    m_ended_in_reference.clear();
+    if (m_frames.empty()) m_kept_texts.clear();
 }
 
 bool c_get_with_entities::admit_entity_text(const char* value) {

@@ -51,6 +51,22 @@ public:
     bool set_input_entity_value(const char* value);
     std::size_t get_entity_stack_depth() const { return m_frames.size(); }
 
+    /// Stands for the reading of one reference, from behind its "&" or "%". An entity whose text ends within
+    /// the reference counts as open for what it refers to: "&a" as the whole text of `a` is a recursion like
+    /// "&a;".
+    class c_reference {
+    public:
+        explicit c_reference(c_get_with_entities& getter) : m_getter(getter) {
+            m_getter.m_in_reference = true;
+        }
+        c_reference(const c_reference&) = delete;
+        c_reference& operator=(const c_reference&) = delete;
+        ~c_reference() { m_getter.end_reference(); }
+
+    private:
+        c_get_with_entities& m_getter;
+    };
+
     /// Limits the bytes that entities may deliver in one document, as input and within values together.
     void set_max_entity_expansion(std::size_t bytes) { m_max_expansion = bytes; }
     /// Counts the bytes of an entity value that is about to be delivered. False after a fatal EQBX_BAD_DTD
@@ -71,8 +87,11 @@ private:
     void define(entity_table* table, const char* name, const char* value);
     void keep_text(s_frame* frame);
     void close_frame();
+    void end_reference();
 
     std::vector<s_frame> m_frames;
+    std::vector<const char*> m_ended_in_reference;
+    bool m_in_reference = false;
     std::unordered_set<const char*> m_open;
     entity_table m_general;
     entity_table m_parameter;

@@ -15,14 +15,15 @@ constexpr char k_xml_prefix[] = "xml";
 int c_enumerated_namespaces::add_namespace(const char* uri) {
     int id = k_ns_not_found;
     if (m_ids.find(uri, &id)) return id;
-    id = m_next_id++;
-    m_ids.add(uri, id);
+    id = m_next_id;
+    if (m_next_id < INT_MAX) ++m_next_id;
+    store(uri, id);
     return id;
 }
 
 void c_enumerated_namespaces::add_namespace(const char* uri, int id) {
     int known = k_ns_not_found;
-    if (!m_ids.find(uri, &known)) m_ids.add(uri, id);
+    if (!m_ids.find(uri, &known)) store(uri, id);
     if (id >= m_next_id && id < INT_MAX) m_next_id = id + 1;
 }
 
@@ -33,17 +34,21 @@ int c_enumerated_namespaces::find_namespace(const std::string& uri) const {
 }
 
 const char* c_enumerated_namespaces::find_namespace_from_id(int id) const {
-    for (std::size_t i = 0; i < m_ids.size(); ++i) {
-        if (m_ids.value_at(i) == id) return m_ids.key_at(i);
-    }
-    return nullptr;
+    const auto found = m_first_with_id.find(id);
+    return found == m_first_with_id.end() ? nullptr : m_ids.key_at(found->second);
+}
+
+void c_enumerated_namespaces::store(const char* uri, int id) {
+    m_first_with_id.emplace(id, m_ids.size());
+    m_ids.add(uri, id);
 }
 
 void c_enumerated_namespaces::clear() {
     m_ids.clear();
+    m_first_with_id.clear();
     m_next_id = k_ns_first_free;
-    m_ids.add(k_xsi_uri, k_ns_xsi);
-    m_ids.add(k_xml_uri, k_ns_xml);
+    store(k_xsi_uri, k_ns_xsi);
+    store(k_xml_uri, k_ns_xml);
 }
 
 void c_xml_local::add_namespace(const char* prefix, int id) {

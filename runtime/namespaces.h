@@ -1,6 +1,8 @@
 #pragma once
 
+#include <cstddef>
 #include <string>
+#include <unordered_map>
 
 #include "platform/api.h"
 #include "runtime/repository.h"
@@ -42,8 +44,11 @@ public:
     void clear();
 
 private:
+    void store(const char* uri, int id);
+
     int m_next_id = k_ns_first_free;
     c_repository<int> m_ids;
+    std::unordered_map<int, std::size_t> m_first_with_id;
 };
 
 /// One scope of prefix declarations, mostly that of one open element. A child finds what its parents declare.

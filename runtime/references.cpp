@@ -70,6 +70,7 @@ bool c_get_for_xml::insert_character_entity(c_entity_name_reader& reader, std::s
     if (value <= 127) {
         add_char_wsp(out, static_cast<int>(value), true);
     } else {
+        // Intended: past the white-space mode, like the predefined entities.
         char bytes[5];
         out->append(unicode_char_to_utf8(static_cast<int>(value), bytes));
     }
@@ -81,11 +82,13 @@ bool c_get_for_xml::insert_character_entity(c_entity_name_reader& reader, std::s
 /// character reference.
 bool c_xml::expand_reference(c_entity_name_reader& reader, std::string* out) {
     const char* value = nullptr;
+    if (!reader.is_input_mode()) {
+        return resolve_reference(reader, out, &value) && (value == nullptr || expand_inline(value, out));
+    }
+    const c_get_with_entities::c_reference reference(m_getter);
     if (!resolve_reference(reader, out, &value)) return false;
-    if (value == nullptr) return true;
-    if (!reader.is_input_mode()) return expand_inline(value, out);
     // Intended: true after a recursion too. Its fatal report has ended the input.
-    m_getter.set_input_entity_value(value);
+    if (value != nullptr) m_getter.set_input_entity_value(value);
     return true;
 }
 
@@ -95,6 +98,7 @@ bool c_xml::resolve_reference(c_entity_name_reader& reader, std::string* out, co
     if (c == '#') return m_getter.insert_character_entity(reader, out);
     const bool closed = detail::read_reference_name(reader, c, &m_entity_name);
     if (const char predefined = detail::predefined_entity(m_entity_name)) {
+        // Intended: past the white-space mode. A space that is held back comes out behind it.
         out->push_back(predefined);
         return true;
     }
