@@ -82,19 +82,19 @@ TEST(HostileInput, AMillionWordsInOneText) {
     EXPECT_EQ(at.xml.get_line_num(), 1000001);
 }
 
-TEST(HostileInput, AHundredThousandEntities) {
+TEST(HostileInput, ManyEntities) {
     std::string text = "<!DOCTYPE a [";
-    for (int i = 0; i < 100000; ++i) text += numbered("<!ENTITY e", i, numbered(" '", i, "'>").c_str());
-    text += "]><a b='&e99999;'>";
-    for (int i = 0; i < 100000; ++i) text += numbered("&e", i, ";");
+    for (int i = 0; i < 30000; ++i) text += numbered("<!ENTITY e", i, numbered(" '", i, "'>").c_str());
+    text += "]><a b='&e29999;'>";
+    for (int i = 0; i < 30000; ++i) text += numbered("&e", i, ";");
     AtElement at(text + "</a>");
     ASSERT_EQ(at.event, EQXP_NAME);
     EXPECT_EQ(at.xml.get_attribute_name(&at.name, false), EQXP_NAME);
     EXPECT_TRUE(at.xml.get_attribute_value(&at.value, EQBX_WS_PRESERVE));
-    EXPECT_EQ(at.value, "99999");
+    EXPECT_EQ(at.value, "29999");
     EXPECT_TRUE(at.xml.skip_start_tag(nullptr));
     EXPECT_TRUE(at.xml.get_element_value(&at.value, EQBX_WS_PRESERVE, true));
-    EXPECT_EQ(at.value.size(), 488890U);
+    EXPECT_EQ(at.value.size(), 138890U);
 }
 
 /// e0 refers to e1, e1 to e2, and so on; the last one is "x".
@@ -106,12 +106,12 @@ std::string chain_of_entities(int length, const char* body) {
     return join({text, "]>", body});
 }
 
-TEST(HostileInput, AChainOfAHundredThousandEntitiesNeedsNoStack) {
-    AtElement in_attribute(chain_of_entities(100000, "<a b='&e0;'/>"));
+TEST(HostileInput, ALongChainOfEntitiesNeedsNoStack) {
+    AtElement in_attribute(chain_of_entities(30000, "<a b='&e0;'/>"));
     in_attribute.xml.get_attribute_name(&in_attribute.name, false);
     EXPECT_TRUE(in_attribute.xml.get_attribute_value(&in_attribute.value, EQBX_WS_PRESERVE));
     EXPECT_EQ(in_attribute.value, "x");
-    AtElement in_content(chain_of_entities(100000, "<a>&e0;</a>"));
+    AtElement in_content(chain_of_entities(30000, "<a>&e0;</a>"));
     in_content.xml.skip_start_tag(nullptr);
     EXPECT_TRUE(in_content.xml.get_element_value(&in_content.value, EQBX_WS_PRESERVE, true));
     EXPECT_EQ(in_content.value, "x");

@@ -53,7 +53,7 @@ std::string on_all_paths(const std::string& bytes, const Walk& walk) {
     compare("from memory with runs", walk(with_runs, true));
     qbxV2::c_read_memory without_runs = memory.source();
     compare("from memory without runs", walk(without_runs, false));
-    for (const std::size_t length : {1, 2, 3, 7}) {
+    for (const std::size_t length : {1U, 2U, 3U, 7U}) {
         ChunkSource chunks(bytes, length);
         compare(join({"in runs of ", std::to_string(length)}), walk(chunks, true));
     }
