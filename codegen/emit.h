@@ -4,6 +4,7 @@
 
 #include "codegen/class_plan.h"
 #include "codegen/printer.h"
+#include "codegen/reference_plan.h"
 
 /// The last stage: prints what the plan says, and decides nothing but the layout of text.
 namespace vrl_codegen {
@@ -34,8 +35,21 @@ std::string emit_module_source(const module_plan& module);
 // emit_limits.cpp: the constants that hold facets.
 void define_limits(printer& out, const limits_plan& limits);
 
+// emit_reference.cpp: the reference pages of the format, in Markdown.
+std::string emit_reference(const reference_plan& reference);
+
 // emit_driver.cpp: the tests' own description of the model.
 std::string emit_driver(const module_plan& module);
 std::string emit_driver_list(const plan& model);
+
+// emit_flat.cpp: the C functions, their header, the names in messages, the list of exports.
+std::string emit_flat_header(const plan& model);
+std::string emit_flat_names(const plan& model);
+std::string emit_flat_source(const module_plan& module);
+std::string emit_flat_values_source();
+std::string emit_flat_exports(const plan& model);
+// emit_flat_driver.cpp: the tests' tables of the C functions.
+std::string emit_flat_driver(const module_plan& module);
+std::string emit_flat_driver_list(const plan& model);
 
 }  // namespace vrl_codegen

@@ -17,10 +17,16 @@ void write_if_changed(const std::filesystem::path& path, const std::string& text
     std::ostringstream present;
     present << old.rdbuf();
     if (old.is_open() && present.str() == text) return;
-    std::filesystem::create_directories(path.parent_path());
+    if (path.has_parent_path()) std::filesystem::create_directories(path.parent_path());
     std::ofstream file(path, std::ios::binary);
     file << text << std::flush;
     if (!file) throw std::runtime_error("cannot write " + path.string());
+}
+
+void write_reference(const std::string& schema_path, const std::filesystem::path& file) {
+    const vrl_codegen::schema source = vrl_codegen::read_schema(schema_path);
+    const vrl_codegen::plan model = vrl_codegen::make_plan(source);
+    write_if_changed(file, emit_reference(plan_reference(source, model)));
 }
 
 void generate(const std::string& schema_path, const std::filesystem::path& out) {
@@ -33,7 +39,15 @@ void generate(const std::string& schema_path, const std::filesystem::path& out) 
     write_if_changed(v2 / "format.h", emit_format(model));
     write_if_changed(v2 / "Vrl.h", emit_chief_header(model));
     write_if_changed(out / "driver" / "classes.cpp", emit_driver_list(model));
+    const std::filesystem::path flat = out / "flat";
+    write_if_changed(flat / "vrl_flat.h", emit_flat_header(model));
+    write_if_changed(flat / "class_names.h", emit_flat_names(model));
+    write_if_changed(flat / "exports.txt", emit_flat_exports(model));
+    write_if_changed(flat / "values.cpp", emit_flat_values_source());
+    write_if_changed(out / "flat_driver" / "classes.cpp", emit_flat_driver_list(model));
     for (const module_plan& module : model.modules) {
+        write_if_changed(flat / (module.name + ".cpp"), emit_flat_source(module));
+        write_if_changed(out / "flat_driver" / (module.name + ".cpp"), emit_flat_driver(module));
         write_if_changed(v2 / (module.name + ".h"), emit_module_header(module));
         write_if_changed(v2 / (module.name + ".cpp"), emit_module_source(module));
         write_if_changed(out / "driver" / (module.name + ".cpp"), emit_driver(module));
@@ -43,13 +57,20 @@ void generate(const std::string& schema_path, const std::filesystem::path& out) 
 }  // namespace
 
 int main(int argc, char** argv) {
-    if (argc != 3) {
+    const bool reference = argc == 4 && std::string(argv[2]) == "--reference";
+    if (argc != 3 && !reference) {
         std::cerr << "usage: vrl_codegen SCHEMA OUTPUT_FOLDER\n"
-                     "Compiles the document schema into the C++ classes of the model.\n";
+                     "           compiles the document schema into the C++ classes of the model\n"
+                     "       vrl_codegen SCHEMA --reference FILE\n"
+                     "           writes the reference pages of the format\n";
         return 2;
     }
     try {
-        generate(argv[1], argv[2]);
+        if (reference) {
+            write_reference(argv[1], argv[3]);
+        } else {
+            generate(argv[1], argv[2]);
+        }
     } catch (const std::exception& failure) {
         std::cerr << "vrl_codegen: " << failure.what() << '\n';
         return 1;

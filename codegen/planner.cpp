@@ -135,6 +135,10 @@ private:
         member.has_presence = !has_note(element.notes, "no-presence");
         member.token = m_tokens.element(element.name);
         member.documentation = element.documentation;
+        if (element.kind == element_declaration::form::reference) {
+            member.documentation =
+                first_given(element.documentation, m_source.find_element(element.name)->documentation);
+        }
         if (element.kind == element_declaration::form::simple) {
             plan_simple(element, owner, member);
         } else if (member.is_group()) {

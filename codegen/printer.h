@@ -21,6 +21,8 @@ public:
 
     /// What was printed, laid out.
     std::string text() const;
+    /// What was printed as it stands: a part of a larger text.
+    const std::string& fragment() const { return m_text; }
 
 private:
     const std::string& value_of(const std::string& name, const values& holes) const;

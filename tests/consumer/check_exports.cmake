@@ -1,3 +1,4 @@
+cmake_minimum_required(VERSION 3.25)
 # Everything that the library exports has a name of its own: the two namespaces and the flat layer.
 # What a compiler emits for templates of the standard library is weak, and is every program's own.
 execute_process(COMMAND ${VRL_NM} -D --defined-only -C ${VRL_LIBRARY} OUTPUT_VARIABLE symbols

@@ -1,0 +1,98 @@
+#include "flat/strings.h"
+
+#include <atomic>
+#include <cstdint>
+#include <cstdlib>
+#include <cstring>
+
+#include "flat/vrl_flat_base.h"
+#include "platform/loaded_symbols.h"
+
+namespace vrl_flat {
+namespace {
+
+constexpr std::size_t k_length_size = sizeof(std::uint32_t);
+// Runtimes round the size of a block up to this.
+constexpr std::size_t k_granule = 16;
+
+/// The bytes ahead of a text, 0 until they are decided.
+std::atomic<std::size_t> g_prefix{0};
+
+std::size_t prefix() {
+    std::size_t bytes = g_prefix.load(std::memory_order_relaxed);
+    if (bytes == 0) {
+        // Classic Mono frees a text from its length on, .NET from a whole pointer ahead of the text.
+        bytes = vrl_platform::process_offers("mono_free_bstr") ? k_length_size : sizeof(void*);
+        g_prefix.store(bytes, std::memory_order_relaxed);
+    }
+    return bytes;
+}
+
+/// Room for `length` bytes and a zero unit; the length is written, the text is not.
+char* allocate(std::size_t length) {
+    const std::size_t needed = prefix() + length + sizeof(char16_t);
+    const std::size_t size = (needed + k_granule - 1) / k_granule * k_granule;
+    if (length > UINT32_MAX) return nullptr;
+    auto* const block = static_cast<char*>(std::malloc(size));
+    if (block == nullptr) return nullptr;
+    char* const text = block + prefix();
+    const auto counted = static_cast<std::uint32_t>(length);
+    std::memcpy(text - k_length_size, &counted, k_length_size);
+    std::memset(text + length, 0, sizeof(char16_t));
+    return text;
+}
+
+bool is_beyond_one_unit(wchar_t c) { return static_cast<std::uint32_t>(c) > 0xFFFF; }
+
+/// The units that a wide string becomes: an element above 0xFFFF is a pair.
+std::size_t unit_count(const std::wstring& text) {
+    std::size_t count = text.size();
+    for (const wchar_t c : text) count += is_beyond_one_unit(c) ? 1U : 0U;
+    return count;
+}
+
+}  // namespace
+
+char16_t* new_text(const std::wstring& text) {
+    auto* const made = reinterpret_cast<char16_t*>(allocate(unit_count(text) * sizeof(char16_t)));
+    if (made == nullptr) return nullptr;
+    char16_t* to = made;
+    for (const wchar_t c : text) {
+        const auto code = static_cast<std::uint32_t>(c);
+        if (is_beyond_one_unit(c)) {
+            *to++ = static_cast<char16_t>(0xD800 + ((code - 0x10000) >> 10));
+            *to++ = static_cast<char16_t>(0xDC00 + (code & 0x3FF));
+        } else {
+            *to++ = static_cast<char16_t>(code);
+        }
+    }
+    return made;
+}
+
+char* new_text(const std::string& bytes) {
+    char* const made = allocate(bytes.size());
+    if (made != nullptr) std::memcpy(made, bytes.data(), bytes.size());
+    return made;
+}
+
+std::wstring wide(const char16_t* text) {
+    if (text == nullptr) return {};
+    return {text, text + std::char_traits<char16_t>::length(text)};
+}
+
+}  // namespace vrl_flat
+
+extern "C" {
+
+void vrl_free_string(void* text) {
+    if (text != nullptr) std::free(static_cast<char*>(text) - vrl_flat::prefix());
+}
+
+void vrl_set_string_prefix(int32_t bytes) {
+    const auto wanted = static_cast<std::size_t>(bytes);
+    if (wanted == vrl_flat::k_length_size || wanted == sizeof(std::uint64_t)) {
+        vrl_flat::g_prefix.store(wanted, std::memory_order_relaxed);
+    }
+}
+
+}  // extern "C"
