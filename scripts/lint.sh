@@ -1,0 +1,32 @@
+#!/usr/bin/env bash
+# Form and warnings: clang-format on what is written by hand, then clang-tidy and the warnings of g++ and
+# clang++, as errors, on everything, generated sources included. Goes through all of it before it fails.
+set -uo pipefail
+cd "$(dirname "$0")/.."
+
+scripts/install_packages.sh build test lint || exit 1
+failed=()
+
+echo "== clang-format"
+git ls-files -z '*.h' '*.cpp' ':!:tests/codegen/golden' | xargs -0 clang-format --dry-run -Werror || failed+=(clang-format)
+
+for compiler in g++ clang++; do
+    echo "== $compiler"
+    folder=build-lint/$compiler
+    launcher=()
+    if command -v ccache >/dev/null; then launcher=(-DCMAKE_CXX_COMPILER_LAUNCHER=ccache); fi
+    # The optimiser sees more, so warnings are asked for at the level that ships.
+    cmake -S . -B "$folder" -G Ninja -DCMAKE_BUILD_TYPE=Release -DCMAKE_CXX_COMPILER=$compiler \
+        -DCMAKE_EXPORT_COMPILE_COMMANDS=ON -DCMAKE_COMPILE_WARNING_AS_ERROR=ON "${launcher[@]}" >/dev/null &&
+        cmake --build "$folder" -- -k 0 || failed+=("$compiler")
+done
+
+echo "== clang-tidy"
+run-clang-tidy -quiet -p build-lint/clang++ "$PWD/(build-lint|platform|runtime|V2|zip|flat|codegen|tests|fuzz|examples)/" ||
+    failed+=(clang-tidy)
+
+if [ ${#failed[@]} -gt 0 ]; then
+    echo "lint: failed: ${failed[*]}"
+    exit 1
+fi
+echo "lint: clean"
