@@ -10,7 +10,9 @@
 namespace vrl_codegen {
 
 // emit_common.cpp
-/// Lines of a documentation comment; none for no text.
+/// Lines of words behind a prefix, as long as lines may be; none for no text.
+std::string filled(const std::string& text, const std::string& prefix);
+/// Lines of a documentation comment.
 std::string comment(const std::string& text, const std::string& indent);
 /// A string literal, and a wide one.
 std::string quoted(const std::string& text);

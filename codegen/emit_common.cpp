@@ -1,24 +1,28 @@
+#include <algorithm>
+
 #include "codegen/emit.h"
 #include "codegen/layout.h"
 
 namespace vrl_codegen {
 
-std::string comment(const std::string& text, const std::string& indent) {
+std::string filled(const std::string& text, const std::string& prefix) {
     std::string lines;
-    std::string line = indent + "///";
-    std::size_t start = 0;
-    while (start < text.size()) {
-        std::size_t end = text.find(' ', start);
-        if (end == std::string::npos) end = text.size();
+    std::string line;
+    for (std::size_t start = 0; start < text.size();) {
+        const std::size_t end = std::min(text.find(' ', start), text.size());
         const std::string word = text.substr(start, end - start);
-        if (line.size() + 1 + word.size() > k_line_length) {
-            lines += line + "\n";
-            line = indent + "///";
+        if (!line.empty() && line.size() + 1 + word.size() > k_line_length) {
+            lines.append(line).append("\n");
+            line.clear();
         }
-        line += " " + word;
+        line.append(line.empty() ? prefix : " ").append(word);
         start = end + 1;
     }
-    return text.empty() ? std::string() : lines + line + "\n";
+    return text.empty() ? std::string() : lines.append(line).append("\n");
+}
+
+std::string comment(const std::string& text, const std::string& indent) {
+    return filled(text, std::string(indent).append("/// "));
 }
 
 std::string quoted(const std::string& text) {

@@ -1,3 +1,6 @@
+#include <algorithm>
+#include <utility>
+
 #include "codegen/emit.h"
 #include "codegen/reference_words.h"
 
@@ -20,9 +23,13 @@ Literals of enumerations are numbered from 1 in memory, the members of a group a
 
 )";
 
+void print_paragraph(printer& out, const std::string& text) {
+    if (!text.empty()) out.print("$lines$\n", {{"lines", filled(text, "")}});
+}
+
 void print_list(printer& out, const std::string& before, const std::vector<std::string>& items) {
     if (items.empty()) return;
-    out.print("$before$ $items$.\n\n", {{"before", before}, {"items", join(items, ", ")}});
+    print_paragraph(out, std::string(before).append(" ").append(join(items, ", ")).append("."));
 }
 
 void print_elements(printer& out, const std::vector<reference_element>& elements) {
@@ -43,36 +50,41 @@ void print_elements(printer& out, const std::vector<reference_element>& elements
     out.print("\n");
 }
 
+/// A column that no row fills is left out.
+void print_rows(printer& out, const char* head, const std::vector<reference_row>& rows) {
+    if (rows.empty()) return;
+    using cell = std::string reference_row::*;
+    std::vector<std::pair<const char*, cell>> columns;
+    for (const auto& [title, column] : {std::pair<const char*, cell>("Number", &reference_row::number),
+                                        {head, &reference_row::name},
+                                        {"Type", &reference_row::type},
+                                        {"Occurs", &reference_row::occurs},
+                                        {"Values", &reference_row::values},
+                                        {"Meaning", &reference_row::meaning}}) {
+        const bool used = std::any_of(rows.begin(), rows.end(),
+                                      [c = column](const reference_row& row) { return !(row.*c).empty(); });
+        if (used) columns.emplace_back(title, column);
+    }
+    for (const auto& column : columns) out.print("| $title$ ", {{"title", column.first}});
+    out.print("|\n");
+    for (std::size_t i = 0; i < columns.size(); ++i) out.print("|---");
+    out.print("|\n");
+    for (const reference_row& row : rows) {
+        for (const auto& column : columns) out.print("| $cell$ ", {{"cell", row.*column.second}});
+        out.print("|\n");
+    }
+    out.print("\n");
+}
+
 void print_group(printer& out, const reference_group& group) {
     out.print(R"(### $title$
 
 Wherever a type refers to `$head$`, one of these elements stands.
 
-| Number | Element | Type |
-|---|---|---|
 )",
               {{"title", group.title}, {"head", group.head}});
-    int number = 0;
-    for (const reference_row& member : group.members) {
-        out.print("| $number$ | $name$ | $type$ |\n",
-                  {{"number", std::to_string(number++)}, {"name", member.name}, {"type", member.type}});
-    }
-    out.print("\n");
+    print_rows(out, "Element", group.members);
     print_list(out, "Used in", group.used_in);
-}
-
-void print_rows(printer& out, const char* head, const std::vector<reference_row>& rows) {
-    if (rows.empty()) return;
-    out.print(std::string("| ").append(head).append(
-        " | Type | Occurs | Values | Meaning |\n|---|---|---|---|---|\n"));
-    for (const reference_row& row : rows) {
-        out.print("| $name$ | $type$ | $occurs$ | $values$ | $meaning$ |\n", {{"name", row.name},
-                                                                              {"type", row.type},
-                                                                              {"occurs", row.occurs},
-                                                                              {"values", row.values},
-                                                                              {"meaning", row.meaning}});
-    }
-    out.print("\n");
 }
 
 void print_text(printer& out, const reference_row& text) {
@@ -85,11 +97,12 @@ void print_text(printer& out, const reference_row& text) {
 
 void print_type(printer& out, const reference_type& type) {
     out.print("### $title$\n\n", {{"title", type.title}});
-    if (!type.meaning.empty()) out.print("$meaning$\n\n", {{"meaning", type.meaning}});
+    print_paragraph(out, type.meaning);
     if (!type.extends.empty()) {
-        out.print("Extends $base$: what stands there comes first.\n\n", {{"base", type.extends}});
+        print_paragraph(
+            out, std::string("Extends ").append(type.extends).append(": what stands there comes first."));
     }
-    for (const std::string& remark : type.remarks) out.print("$remark$\n\n", {{"remark", remark}});
+    for (const std::string& remark : type.remarks) print_paragraph(out, remark);
     if (type.has_text) print_text(out, type.text);
     print_rows(out, "Attribute", type.attributes);
     print_rows(out, type.is_choice ? "One of" : "Child", type.children);
@@ -99,7 +112,8 @@ void print_type(printer& out, const reference_type& type) {
 }
 
 void print_simple_type(printer& out, const reference_simple_type& type) {
-    out.print("### $title$\n\n$meaning$\n\n", {{"title", type.title}, {"meaning", type.meaning}});
+    out.print("### $title$\n\n", {{"title", type.title}});
+    print_paragraph(out, type.meaning);
     if (type.literals.empty()) {
         const bool any = type.values.empty();
         print_list(out,
@@ -115,7 +129,8 @@ void print_simple_type(printer& out, const reference_simple_type& type) {
 
 void print_module(printer& out, const reference_module& module) {
     const printer_scope scope(out, {{"module", module.name}});
-    out.print("## $title$\n\n$meaning$\n\n", {{"title", module.title}, {"meaning", module.meaning}});
+    out.print("## $title$\n\n", {{"title", module.title}});
+    print_paragraph(out, module.meaning);
     print_elements(out, module.elements);
     for (const reference_group& group : module.groups) print_group(out, group);
     for (const reference_type& type : module.types) print_type(out, type);

@@ -42,7 +42,7 @@ private:
             const std::string use = link_to(title_of(type), title_of(type));
             if (element.kind == form::reference) {
                 m_element_uses[element.name].push_back(use);
-            } else if (!element.type_key.empty()) {
+            } else if (element.kind == form::named_type) {
                 m_type_uses[element.type_key].push_back(
                     std::string(use).append(" as ").append(code(element.name)));
             }
@@ -60,12 +60,21 @@ private:
             if (m_source.is_head(element.name)) pages.groups.push_back(plan_group(element));
         }
         for (const complex_type& type : m_source.types) {
-            if (type.module == module.name) pages.types.push_back(plan_type(type));
+            const bool outermost = type.key.find('/', 1) == std::string::npos;
+            if (outermost && type.module == module.name) add_type(pages, type);
         }
         for (const simple_type& type : m_source.simple_types) {
             if (type.module == module.name) pages.simple_types.push_back(plan_simple_type(type));
         }
         return pages;
+    }
+
+    /// A type, and behind it those that are declared inside it.
+    void add_type(reference_module& pages, const complex_type& type) {
+        pages.types.push_back(plan_type(type));
+        for (const element_declaration& element : type.elements) {
+            if (element.kind == form::anonymous_type) add_type(pages, *m_source.find_type(element.type_key));
+        }
     }
 
     reference_element plan_element(const global_element& element) {
@@ -99,6 +108,7 @@ private:
             const global_element& element = *m_source.find_element(member.element);
             const complex_type& type = *m_source.find_type(element.type_key);
             reference_row row;
+            row.number = std::to_string(group.members.size());
             row.name = code(element.name);
             row.type = member.is_head ? "named by `xsi:type`" : link_to(title_of(type), title_of(type));
             group.members.push_back(std::move(row));
@@ -127,7 +137,9 @@ private:
         made.extended_by = m_extended_by[type.key];
         made.used_in = m_type_uses[type.key];
         for (const global_element& element : m_source.elements) {
-            if (element.type_key == type.key) made.used_in.push_back("element " + code(element.name));
+            if (element.type_key != type.key) continue;
+            if (element.anonymous) made.used_in = m_element_uses[element.name];
+            if (!element.anonymous) made.used_in.push_back("element " + code(element.name));
         }
         return made;
     }

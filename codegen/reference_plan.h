@@ -11,6 +11,7 @@ namespace vrl_codegen {
 
 /// A row of a table; cells are Markdown.
 struct reference_row {
+    std::string number;
     std::string name;
     std::string type;
     std::string occurs;

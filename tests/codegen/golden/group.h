@@ -68,6 +68,7 @@ public:
     /// Whether everything that writing demands of this element itself is present.
     bool is_occurs_ok() const;
 
+    /// A shape that tells its type by xsi:type.
     sg_Shape const& get_Shape() const;
     sg_Shape& get_Shape();
     sg_Shape& assign_Shape(sg_Shape const& value);
@@ -115,6 +116,7 @@ public:
     /// Whether everything that writing demands of this element itself is present.
     bool is_occurs_ok() const;
 
+    /// A shape that tells its type by xsi:type.
     unsigned size_Shape() const;
     sg_Shape const& get_Shape(unsigned i) const;
     sg_Shape& get_Shape(unsigned i);
