@@ -33,6 +33,15 @@ std::size_t plain_utf8_length(const unsigned char* p, const unsigned char* end) 
     return left >= 4 && is_plain_four(p) ? 4 : 0;
 }
 
+const unsigned char* skip_plain_utf8(const unsigned char* p, const unsigned char* end) {
+    while (p != end && *p >= 0x80) {
+        const std::size_t length = plain_utf8_length(p, end);
+        if (length == 0) break;
+        p += length;
+    }
+    return p;
+}
+
 bool is_printable_ascii(const char* s, std::size_t size) {
     constexpr std::uint64_t k_high_bits = 0x8080808080808080;
     constexpr std::uint64_t k_spaces = 0x2020202020202020;
@@ -58,9 +67,9 @@ s_scan scan_up_to(const unsigned char* p, const unsigned char* end, unsigned cha
             ++p;
             continue;
         }
-        const std::size_t length = utf8 ? plain_utf8_length(p, end) : 0;
-        if (length == 0) break;
-        p += length;
+        const unsigned char* const behind = utf8 ? skip_plain_utf8(p, end) : p;
+        if (behind == p) break;
+        p = behind;
     }
     return {p, line_feeds};
 }

@@ -12,6 +12,9 @@ namespace qbxV2::detail {
 /// Well-Formed UTF-8 Byte Sequences.
 std::size_t plain_utf8_length(const unsigned char* p, const unsigned char* end);
 
+/// Behind the sequences of that kind that begin at `p`.
+const unsigned char* skip_plain_utf8(const unsigned char* p, const unsigned char* end);
+
 inline bool is_plain_name_start(unsigned char c) { return c < 0x80 && byte_is(c, cc_name_start); }
 
 /// Behind the ASCII name characters that begin at `p`.
@@ -53,9 +56,9 @@ s_scan scan_run(const unsigned char* p, const unsigned char* end, unsigned mask,
         } else if (*p == also) {
             ++p;
         } else {
-            const std::size_t length = utf8 && *p >= 0x80 ? plain_utf8_length(p, end) : 0;
-            if (length == 0) break;
-            p += length;
+            const unsigned char* const behind = utf8 ? skip_plain_utf8(p, end) : p;
+            if (behind == p) break;
+            p = behind;
         }
     }
     return {p, line_feeds};

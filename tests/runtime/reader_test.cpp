@@ -2,7 +2,6 @@
 
 #include <gtest/gtest.h>
 
-#include <clocale>
 #include <filesystem>
 #include <fstream>
 
@@ -381,83 +380,6 @@ TEST(ReaderLocal, NestsLikeAStack) {
     EXPECT_EQ(r.reader.get_reader_local(), root);
 }
 
-TEST(ReaderNamespaces, OfTheFormatGetItsIdsAndMappingsTheNextOnes) {
-    Reading r("<p:a/><b/>");
-    r.reader.add_namespace_mapping("p", "mapped");
-    r.reader.add_namespace_mapping("V", "doc");
-    r.reader.add_default_namespace_mapping("default");
-    EXPECT_EQ(r.reader.find_enumerated_namespace("mapped"), 0) << "nothing happens before set_ns_map";
-    for (int i = 0; i < 2; ++i) {
-        r.reader.set_ns_map(k_ns_map);
-        EXPECT_EQ(r.reader.find_enumerated_namespace("doc"), 1000);
-        EXPECT_EQ(r.reader.find_enumerated_namespace("mapped"), 1001);
-        EXPECT_EQ(r.reader.find_enumerated_namespace("default"), 1002);
-    }
-    c_xml_reader_local scope(r.reader);
-    r.element(nullptr);
-    EXPECT_EQ(r.reader.get_ns_id(), 1001);
-    r.attribute();
-    r.element(nullptr);
-    EXPECT_EQ(r.reader.get_ns_id(), 1002);
-    EXPECT_EQ(r.reader.get_ns_id(&scope, "V:x"), 1000);
-}
-
-TEST(ReaderNamespaces, HaveToBeSetAgainAfterARewind) {
-    Reading r("<V:one xmlns:V='doc'/>");
-    EXPECT_EQ(r.element(), 14);
-    r.reader.rewind();
-    r.reader.set_ns_map(k_ns_map);
-    EXPECT_EQ(r.element(), 14);
-}
-
-TEST(GetNamespace, ResolvesThePrefixFromTheCurrentScope) {
-    Reading r("<a xmlns:p='u' xmlns='v'><b xmlns=''/></a>");
-    std::string out;
-    EXPECT_EQ(r.reader.get_namespace("q:x", &out), " ");
-    EXPECT_EQ(out, c_xml_reader::k_namespace_not_found);
-    EXPECT_EQ(r.reader.get_namespace("x", &out), " ");
-    r.element();
-    EXPECT_EQ(&r.reader.get_namespace("p:x", &out), &out);
-    EXPECT_EQ(out, "u");
-    EXPECT_EQ(r.reader.get_namespace("x", &out), "v");
-    EXPECT_EQ(r.reader.get_namespace("xml:x", &out), "http://www.w3.org/XML/1998/namespace");
-    r.attribute();
-    c_xml_reader_local scope(r.reader);
-    r.element();
-    EXPECT_EQ(r.reader.get_namespace("x", &out), "");
-    EXPECT_EQ(r.reader.get_namespace("p:x", &out), "u");
-}
-
-struct QName {
-    const char* name;
-    bool valid;
-};
-void PrintTo(const QName& q, std::ostream* os) { *os << "'" << q.name << "'"; }
-
-class ValidQName : public testing::TestWithParam<QName> {};
-
-TEST_P(ValidQName, NeedsANamespaceAndAsciiLetters) {
-    Reading r("<a xmlns:p='u' xmlns:_='u' xmlns:\xC3\xA9='u' xmlns:1='u'/>");
-    r.element();
-    EXPECT_EQ(r.reader.is_valid_qname(GetParam().name), GetParam().valid);
-}
-
-INSTANTIATE_TEST_SUITE_P(Names, ValidQName,
-                         testing::Values(QName{"p:x", true}, QName{"p:x.y-z_1", true}, QName{"_:_", true},
-                                         QName{"xml:lang", true}, QName{"p:", false}, QName{"q:x", false},
-                                         QName{"x", false}, QName{"", false}, QName{"p:1", false},
-                                         QName{"p:-x", false}, QName{"p:x y", false},
-                                         QName{"p:\xC3\xA9", false}, QName{"\xC3\xA9:x", false},
-                                         QName{"1:x", false}, QName{":x", false}));
-
-TEST(ValidQNameDefault, WithoutAPrefixNeedsADefaultNamespace) {
-    Reading r("<a xmlns='u'/>");
-    EXPECT_FALSE(r.reader.is_valid_qname("x"));
-    r.element();
-    EXPECT_TRUE(r.reader.is_valid_qname("x"));
-    EXPECT_FALSE(r.reader.is_valid_qname(""));
-}
-
 TEST(ReaderForwards, XsiAndNamedAttributesWithTheCurrentScope) {
     Reading r("<a " XSI "i:type='V:T' xmlns:V='doc' b='1'/>");
     r.element();
@@ -492,98 +414,6 @@ TEST(ReaderBuffers, AreThreeDifferentOnesOfTheReaders) {
     EXPECT_NE(&r.reader.element_name_buffer(), &r.reader.attribute_name_buffer());
     EXPECT_NE(&r.reader.value_buffer(), &r.reader.attribute_name_buffer());
     EXPECT_EQ(r.reader.value_buffer(), "");
-}
-
-class Recovering : public c_xml_reader {
-public:
-    using c_xml_reader::c_xml_reader;
-    eqbx_error user_handle_error(eqbx_error code, const std::string& item_name, const char* source_file,
-                                 int source_line) override {
-        seen =
-            join({std::to_string(code), " ", item_name, " ", source_file, ":", std::to_string(source_line)});
-        return answer == EQBX_UNDEFINED_ERROR
-                   ? c_xml_reader::user_handle_error(code, item_name, source_file, source_line)
-                   : answer;
-    }
-    eqbx_error user_handle_error(eqbx_error code) override {
-        seen += " and " + std::to_string(code);
-        return one_argument_answer;
-    }
-    std::string seen;
-    eqbx_error answer = EQBX_UNDEFINED_ERROR;
-    eqbx_error one_argument_answer = EQBX_NO_ERROR;
-};
-
-TEST(HandleError, ByDefaultReturnsTheCodeAndKeepsItWithTheItem) {
-    Reading r("<a>\n\n<b/></a>");
-    EXPECT_EQ(r.reader.get_error_message(&r.value), "No Error");
-    EXPECT_EQ(r.reader.handle_error(EQBX_MANDATORY_ELEMENT_MISSING, "Vrl:Revision", "x.cpp", 3),
-              EQBX_MANDATORY_ELEMENT_MISSING);
-    EXPECT_EQ(r.reader.get_error_item_name(), "Vrl:Revision");
-    EXPECT_EQ(&r.reader.get_error_message(&r.value), &r.value);
-    EXPECT_EQ(r.value, "line:1-'Vrl:Revision'-Mandatory element missing");
-    r.element();
-    r.attribute();
-    r.element();
-    EXPECT_EQ(r.reader.get_error_message(&r.value), "line:3-'Vrl:Revision'-Mandatory element missing")
-        << "the line is that of the input now";
-    EXPECT_EQ(r.reader.get_error(), EQBX_NO_ERROR) << "the scanner's record is another one";
-}
-
-TEST(HandleError, AnUnknownCodeHasNoText) {
-    Reading r("<a/>");
-    r.reader.handle_error(static_cast<eqbx_error>(999), "i", "", 0);
-    EXPECT_EQ(r.reader.get_error_message(&r.value), "line:1-'i'-");
-}
-
-// Intended: the reader's own item name, handed back in, comes out empty.
-TEST(HandleError, ItsOwnItemNameComesOutEmpty) {
-    Reading r("<a/>");
-    r.reader.handle_error(EQBX_BAD_CHOICE, "item", "", 0);
-    r.reader.handle_error(EQBX_BAD_CHOICE, r.reader.get_error_item_name(), "", 0);
-    EXPECT_EQ(r.reader.get_error_item_name(), "");
-    EXPECT_EQ(r.reader.get_error_message(&r.value), "line:1-''-Inappropriate choice option selected");
-}
-
-TEST(UserHandleError, SeesEverythingAndItsAnswerIsTheResult) {
-    const std::string text = "<a/>";
-    c_read_string source(text);
-    Recovering reader(source);
-    std::string message;
-    reader.answer = EQBX_USER_ERROR_9;
-    EXPECT_EQ(reader.handle_error(EQBX_BAD_CHOICE, "item", "file.cpp", 12), EQBX_USER_ERROR_9);
-    EXPECT_EQ(reader.seen, "7 item file.cpp:12");
-    EXPECT_EQ(reader.get_error_message(&message), "line:1-'item'-User defined error 9");
-    reader.answer = EQBX_UNDEFINED_ERROR;
-    reader.one_argument_answer = EQBX_BAD_DTD;
-    EXPECT_EQ(reader.handle_error(EQBX_BAD_CHOICE, "item", "file.cpp", 13), EQBX_BAD_DTD);
-    EXPECT_EQ(reader.seen, "7 item file.cpp:13 and 7");
-}
-
-TEST(UserHandleError, AZeroClearsTheErrorAndKeepsTheItemName) {
-    const std::string text = "<a/>";
-    c_read_string source(text);
-    Recovering reader(source);
-    std::string message;
-    reader.answer = EQBX_NO_ERROR;
-    EXPECT_EQ(reader.handle_error(EQBX_BAD_CHOICE, "item", "file.cpp", 12), EQBX_NO_ERROR);
-    EXPECT_EQ(reader.get_error_message(&message), "No Error");
-    EXPECT_EQ(reader.get_error_item_name(), "item");
-}
-
-TEST(ReaderErrorInfo, IsThatOfTheScannersRecord) {
-    Reading r("<a/>\n<1>");
-    eqbx_error_type type = EQBX_ET_NONE;
-    eqbx_error code = EQBX_NO_ERROR;
-    int line = 0;
-    EXPECT_FALSE(r.reader.get_error_info(&type, &code, &line));
-    r.element();
-    r.attribute();
-    r.element();
-    ASSERT_TRUE(r.reader.get_error_info(&type, &code, &line));
-    EXPECT_EQ(type, EQBX_ET_ERROR);
-    EXPECT_EQ(code, EQBX_NOT_WELL_FORMED);
-    EXPECT_EQ(line, 2);
 }
 
 TEST(ReaderMemory, ReadsBorrowedBytes) {
