@@ -17,7 +17,7 @@ double encoded_light(double linear) {
     return light <= 0.0031308 ? 12.92 * light : 1.055 * std::pow(light, 1 / 2.4) - 0.055;
 }
 
-// The cube root, with a straight line near black: CIE 15:2004, equations 8.6 to 8.11.
+// The cube root, with a straight line near black: CIE 15:2004, section 8.2.1.
 constexpr double k_delta = 6.0 / 29.0;
 
 double lightness_root(double t) {

@@ -21,8 +21,8 @@ struct lch {
 /// The white of sRGB, x = 0.3127 and y = 0.3290 (IEC 61966-2-1, table 1).
 inline constexpr xyz k_white_d65{0.3127 / 0.3290, 1.0, (1.0 - 0.3127 - 0.3290) / 0.3290};
 
-/// IEC 61966-2-1, section 5.2. The matrix is the unrounded one, as in CSS Color Module Level 4, section 18,
-/// so that grays come out without any chroma.
+/// IEC 61966-2-1, section 5.2. The matrix is the unrounded one, as in the sample code of CSS Color Module
+/// Level 4, so that grays come out without any chroma.
 xyz to_xyz(const rgb& color);
 /// The inverse. What lies outside the gamut is clipped.
 rgb to_srgb(const xyz& color);

@@ -31,7 +31,7 @@ double component(const std::array<double, 3>* rows, std::size_t i, std::size_t w
     return (rows[row][which] + rows[row + 1][which]) / 2;
 }
 
-/// The chromaticity coordinate x of a phase of daylight: CIE 15:2004, equations 3.3 and 3.4.
+/// The chromaticity coordinate x of a phase of daylight, by CIE 15:2004.
 double daylight_x(double kelvin) {
     const double t = 1e3 / kelvin;
     if (kelvin <= 7000) return ((-4.6070 * t + 2.9678) * t + 0.09911) * t + 0.244063;

@@ -24,7 +24,7 @@ inline constexpr double k_step = 5;
 spectrum blackbody(double kelvin);
 /// CIE standard illuminant A: the blackbody of 2848 K with c2 = 1.435e-2 m K, by ISO 11664-2.
 spectrum illuminant_a();
-/// A phase of daylight, relative to 100 at 560 nm: CIE 15:2004, section 3.1, from 4000 to 25000 K.
+/// A phase of daylight, relative to 100 at 560 nm: CIE 15:2004, from 4000 to 25000 K.
 spectrum daylight(double kelvin);
 /// The correlated color temperature behind the name of a daylight illuminant: 6504 K for 6500. Planck's
 /// second constant has changed since they got their names.

@@ -16,7 +16,7 @@ bool is(const xmlNode* node, const char* name) {
 
 std::string attribute(const xmlNode* node, const char* name) {
     xmlChar* value = xmlGetNoNsProp(node, reinterpret_cast<const xmlChar*>(name));
-    const std::string text = value != nullptr ? reinterpret_cast<const char*>(value) : "";
+    std::string text = value != nullptr ? reinterpret_cast<const char*>(value) : "";
     xmlFree(value);
     return text;
 }
@@ -32,7 +32,7 @@ std::string path_of(const xmlNode* declaration) {
     for (const xmlNode* node = declaration; node != nullptr && node->type == XML_ELEMENT_NODE;
          node = node->parent) {
         const std::string name = attribute(node, "name");
-        if (!name.empty()) path = path.empty() ? name : name + '/' + path;
+        if (!name.empty()) path.insert(0, path.empty() ? name : name + '/');
     }
     return path;
 }

@@ -57,7 +57,7 @@ struct chromaticity {
     double x, y;
 };
 
-// CIE 15:2004, table T.3 and appendix, and for the blackbodies Wyszecki and Stiles, table 1(3.11).
+// CIE 15:2004, appendix; the blackbodies as in any table of the Planckian locus.
 TEST(LightSources, HaveThePublishedChromaticities) {
     const auto sources = colors_by_name("light_sources.vrl");
     for (const chromaticity& published :
@@ -77,7 +77,7 @@ TEST(LightSources, HaveThePublishedChromaticities) {
     }
 }
 
-// CIE 15:2004, table T.1.
+// CIE 15:2004, appendix.
 TEST(LightSources, HaveTheSpectrumOfD65ThatIsPublished) {
     const auto sources = colors_by_name("light_sources.vrl");
     const auto& d65 = value_in(sources.at(L"Illuminant D65"), group::chosen_ColorSpaceEmissiveSpectral)
@@ -114,7 +114,7 @@ spectrum fine_reflectance(const vrl_v2::ColorType& color) {
     return fine;
 }
 
-// CIE 15:2004, table T.6.3. It takes every figure of the lamps and of the first eight reflectances together
+// CIE 15:2004, appendix. It takes every figure of the lamps and of the first eight reflectances together
 // to come to these.
 TEST(ReflectancePalette, GivesTheLampsTheirPublishedRenderingIndex) {
     std::vector<spectrum> test_colors;
@@ -158,7 +158,7 @@ struct named_lab {
     examples::lab value;
 };
 
-// Lindbloom's and others' tables of the primaries of sRGB under D65.
+// As widely published for the primaries of sRGB under D65.
 TEST(CssNamedColors, HaveThePublishedLabOfThePrimaries) {
     const auto colors = colors_by_name("css_named_colors.vrl");
     for (const named_lab& published :

@@ -42,7 +42,7 @@ double color_temperature(const ucs& wanted) {
     return std::exp((low + high) / 2);
 }
 
-/// The quantities c and d of the adaptation by von Kries: CIE 13.3, equation 5.9.
+/// The quantities c and d of the adaptation by von Kries.
 std::pair<double, double> adaptation(const ucs& p) {
     return {(4 - p.u - 10 * p.v) / p.v, (1.708 * p.v + 0.404 - 1.481 * p.u) / p.v};
 }
