@@ -1,0 +1,129 @@
+#include "platform/file_exchange.h"
+
+#include <fcntl.h>
+#include <sys/stat.h>
+#include <unistd.h>
+
+#include <atomic>
+#include <cerrno>
+#include <cstdint>
+#include <cstdio>
+#include <string>
+
+#include "platform/clock.h"
+#include "platform/entropy.h"
+
+namespace vrl_platform {
+namespace {
+
+namespace fs = std::filesystem;
+
+constexpr int k_most_names = 100;
+constexpr mode_t k_mode_bits = 07777;
+
+/// Where a chain of links ends. A link that leads nowhere stays what it is.
+fs::path resolve(const fs::path& path) {
+    std::error_code error;
+    if (!fs::is_symlink(path, error)) return path;
+    fs::path resolved = fs::canonical(path, error);
+    return error ? path : resolved;
+}
+
+fs::path folder_of(const fs::path& path) {
+    fs::path folder = path.parent_path();
+    return folder.empty() ? fs::path(".") : folder;
+}
+
+/// Without entropy names are merely different ones: the opening insists on a new file anyway.
+std::uint64_t new_number() {
+    static std::atomic<std::uint64_t> count{0};
+    std::uint64_t number = 0;
+    if (native_entropy().fill(&number, sizeof number)) return number;
+    return (static_cast<std::uint64_t>(native_clock().now()) << 24) ^
+           (static_cast<std::uint64_t>(::getpid()) << 8) ^ ++count;
+}
+
+std::string new_name() {
+    char name[32];
+    std::snprintf(name, sizeof name, ".vrl-%012llx",
+                  static_cast<unsigned long long>(new_number() & 0xFFFFFFFFFFFF));
+    return name;
+}
+
+/// Why a target that is there must not be replaced; 0 if it may.
+int refusal(const fs::path& target, const struct stat& status) {
+    if (S_ISDIR(status.st_mode)) return EISDIR;
+    if (!S_ISREG(status.st_mode)) return EINVAL;
+    return ::faccessat(AT_FDCWD, target.c_str(), W_OK, AT_EACCESS) == 0 ? 0 : errno;
+}
+
+/// The owner first: changing it takes some mode bits away.
+void dress_like(int descriptor, const struct stat& status) {
+    const bool owned = ::fchown(descriptor, status.st_uid, status.st_gid) == 0;
+    const mode_t mode = status.st_mode & k_mode_bits;
+    // Bits that lend the owner's rights are for the old owner's files only.
+    ::fchmod(descriptor, owned ? mode : mode & ~static_cast<mode_t>(S_ISUID | S_ISGID));
+}
+
+class posix_file_exchange : public file_exchange {
+public:
+    io_result open(const fs::path& path) override {
+        const int descriptor = ::open(path.c_str(), O_RDONLY | O_CLOEXEC | O_NOCTTY);
+        if (descriptor < 0) return {-1, errno};
+        struct stat status {};
+        const int error = ::fstat(descriptor, &status) != 0 ? errno : S_ISDIR(status.st_mode) ? EISDIR : 0;
+        if (error == 0) return {descriptor, 0};
+        ::close(descriptor);
+        return {-1, error};
+    }
+
+    replacement create_beside(const fs::path& given) override {
+        replacement made;
+        made.target = resolve(given);
+        struct stat status {};
+        const bool exists = ::stat(made.target.c_str(), &status) == 0;
+        if (!exists && errno != ENOENT) made.error = errno;
+        if (exists) made.error = refusal(made.target, status);
+        if (made.error != 0) return made;
+        make_file(made, exists ? S_IRUSR | S_IWUSR : 0666);
+        if (exists && made.error == 0) dress_like(made.descriptor, status);
+        return made;
+    }
+
+    int replace(const fs::path& from, const fs::path& to) override {
+        return ::rename(from.c_str(), to.c_str()) == 0 ? 0 : errno;
+    }
+
+    int remove(const fs::path& path) override { return ::unlink(path.c_str()) == 0 ? 0 : errno; }
+
+    int commit_folder(const fs::path& path) override {
+        const int descriptor = ::open(folder_of(path).c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC);
+        // A folder that may be written and not read has no flush either.
+        if (descriptor < 0) return errno == EACCES ? 0 : errno;
+        const int error = ::fsync(descriptor) == 0 ? 0 : errno;
+        ::close(descriptor);
+        return error == EINVAL || error == ENOTSUP ? 0 : error;
+    }
+
+private:
+    static void make_file(replacement& made, mode_t mode) {
+        const fs::path folder = made.target.parent_path();
+        for (int i = 0; i < k_most_names; ++i) {
+            made.path = folder / new_name();
+            made.descriptor =
+                ::open(made.path.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC | O_NOFOLLOW, mode);
+            if (made.descriptor >= 0) return;
+            if (errno != EEXIST) break;
+        }
+        made.error = errno;
+    }
+};
+
+}  // namespace
+
+file_exchange& native_file_exchange() {
+    static posix_file_exchange exchange;
+    return exchange;
+}
+
+}  // namespace vrl_platform
