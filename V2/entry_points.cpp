@@ -3,6 +3,7 @@
 #include <string_view>
 
 #include "V2/Vrl.h"
+#include "V2/library_stamp.h"
 #include "V2/packed_route.h"
 #include "platform/file_open.h"
 #include "platform/text_stream.h"
@@ -24,14 +25,6 @@ constexpr eqbx_error k_unknown_suffix = qbxV2::EQBX_USER_ERROR_2;
 bool ends_in(const std::wstring& path, std::wstring_view suffix) {
     return path.size() >= suffix.size() &&
            path.compare(path.size() - suffix.size(), suffix.size(), suffix) == 0;
-}
-
-/// The name under which this library reads and writes.
-SDKType this_library() {
-    SDKType library;
-    library.set_SDKName(L"Vrl2-QBX-3.7.6");
-    library.get_SDKVersion().set_SDKVersion(L"1.0");
-    return library;
 }
 
 /// Stamps the document, const or not, and writes it.
