@@ -2,8 +2,6 @@
 
 #if defined(__SSE2__)
 #include <emmintrin.h>
-
-#include <bit>
 #endif
 
 namespace qbxV2::detail {
@@ -52,7 +50,7 @@ const unsigned char* skip_blocks(const unsigned char* p, const unsigned char* en
     while (end - p >= 16) {
         const block v = _mm_loadu_si128(reinterpret_cast<const block*>(p));
         const auto found = static_cast<unsigned>(_mm_movemask_epi8(Stop::stops(v)));
-        if (found != 0) return p + std::countr_zero(found);
+        if (found != 0) return p + __builtin_ctz(found);
         p += 16;
     }
     return p;

@@ -5,6 +5,7 @@
 namespace qbxV2 {
 
 /// A row of a table that gives names their tokens. A row with a null name ends a table.
+// The order of the fields is part of the interface. NOLINTNEXTLINE(clang-analyzer-optin.performance.Padding)
 struct s_event_map {
     int ns_id;
     const char* name;

@@ -44,7 +44,7 @@ void RecordingErrors::report_error(qbxV2::eqbx_error_type type, qbxV2::eqbx_erro
 
 std::string on_all_paths(const std::string& bytes, const Walk& walk) {
     ReadOnlySource read_only(bytes);
-    const std::string expected = walk(read_only, true);
+    std::string expected = walk(read_only, true);
     const auto compare = [&](const std::string& path, const std::string& outcome) {
         EXPECT_EQ(outcome, expected) << "read " << path << ", against byte by byte: " << printable(bytes);
     };
