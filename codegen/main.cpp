@@ -1,32 +1,18 @@
 #include <exception>
 #include <filesystem>
-#include <fstream>
 #include <iostream>
-#include <sstream>
-#include <stdexcept>
 
 #include "codegen/class_plan.h"
 #include "codegen/emit.h"
+#include "codegen/output_file.h"
 #include "codegen/schema_reader.h"
 
 namespace {
 
-/// Leaves a file alone that already says the same: what didn't change isn't built again.
-void write_if_changed(const std::filesystem::path& path, const std::string& text) {
-    std::ifstream old(path, std::ios::binary);
-    std::ostringstream present;
-    present << old.rdbuf();
-    if (old.is_open() && present.str() == text) return;
-    if (path.has_parent_path()) std::filesystem::create_directories(path.parent_path());
-    std::ofstream file(path, std::ios::binary);
-    file << text << std::flush;
-    if (!file) throw std::runtime_error("cannot write " + path.string());
-}
-
 void write_reference(const std::string& schema_path, const std::filesystem::path& file) {
     const vrl_codegen::schema source = vrl_codegen::read_schema(schema_path);
     const vrl_codegen::plan model = vrl_codegen::make_plan(source);
-    write_if_changed(file, emit_reference(plan_reference(source, model)));
+    vrl_codegen::write_if_changed(file, emit_reference(plan_reference(source, model)));
 }
 
 void generate(const std::string& schema_path, const std::filesystem::path& out) {
