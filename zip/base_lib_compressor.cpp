@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <cerrno>
+#include <cstdint>
 #include <cstdlib>
 #include <new>
 
@@ -18,7 +19,8 @@ bool CBaseLibCompressor::TracksAllocations() const {
 void* CBaseLibCompressor::GetOpaque() { return TracksAllocations() ? this : nullptr; }
 
 void* CBaseLibCompressor::AllocateFor(void* opaque, std::size_t items, std::size_t size) {
-    void* block = std::calloc(items, size);
+    if (size != 0 && items > SIZE_MAX / size) return nullptr;
+    void* block = std::malloc(items * size);
     if (opaque == nullptr || block == nullptr) return block;
     try {
         static_cast<CBaseLibCompressor*>(opaque)->m_allocations.push_back(block);

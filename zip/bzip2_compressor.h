@@ -11,7 +11,7 @@ class CBzip2Compressor : public CBaseLibCompressor {
 public:
     class COptions : public CBaseLibCompressor::COptions {
     public:
-        int GetType() const override { return bzip2; }
+        int GetType() const override { return typeBzip2; }
         std::unique_ptr<CZipCompressor::COptions> Clone() const override;
 
         /// Half the speed for a third of the memory.

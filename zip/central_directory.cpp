@@ -50,7 +50,7 @@ CZipFileHeader& CZipCentralDir::Insert(const CZipFileHeader& header, std::uint16
         m_headers[replaced] = std::move(copy);
         return *m_headers[replaced];
     }
-    CZipFileHeader& added = *ZipArchiveLib::PushBack(m_headers, std::move(copy));
+    CZipFileHeader& added = *ZipArchiveLib::PushBack(m_headers, std::move(copy), m_storage->GetArchivePath());
     if (m_info->findFastEnabled) InsertIntoFindArray(static_cast<std::uint16_t>(m_headers.size() - 1));
     return added;
 }

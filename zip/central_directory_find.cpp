@@ -1,9 +1,9 @@
 #include <algorithm>
-#include <cctype>
 #include <cstring>
 
 #include "zip/central_directory.h"
 #include "zip/growth.h"
+#include "zip/storage.h"
 
 namespace ZipArchiveLib {
 
@@ -34,7 +34,8 @@ void CZipCentralDir::BuildFindArray(bool caseSensitive) {
     m_info->compare = caseSensitive ? ZipArchiveLib::CompareNames : ZipArchiveLib::CompareNamesWithoutCase;
     m_findArray.clear();
     for (std::size_t i = 0; i < m_headers.size(); ++i)
-        ZipArchiveLib::PushBack(m_findArray, {m_headers[i].get(), static_cast<std::uint16_t>(i)});
+        ZipArchiveLib::PushBack(m_findArray, {m_headers[i].get(), static_cast<std::uint16_t>(i)},
+                                m_storage->GetArchivePath());
     std::stable_sort(m_findArray.begin(), m_findArray.end(), [this](const auto& first, const auto& second) {
         return m_info->compare(first.header->GetFileName(), second.header->GetFileName()) < 0;
     });
@@ -51,7 +52,7 @@ std::vector<CZipCentralDir::FindRecord>::iterator CZipCentralDir::FindPlace(cons
 void CZipCentralDir::InsertIntoFindArray(std::uint16_t index) {
     CZipFileHeader& header = GetHeader(index);
     const auto place = FindPlace(header.GetFileName()) - m_findArray.begin();
-    ZipArchiveLib::PushBack(m_findArray, {&header, index});
+    ZipArchiveLib::PushBack(m_findArray, {&header, index}, m_storage->GetArchivePath());
     std::rotate(m_findArray.begin() + place, m_findArray.end() - 1, m_findArray.end());
 }
 

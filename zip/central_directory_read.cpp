@@ -77,7 +77,7 @@ void CZipCentralDir::ReadHeaders(bool exhaustive) {
 }
 
 bool CZipCentralDir::ReadHeader(bool signatureRead) {
-    ZipArchiveLib::PushBack(m_headers, std::make_unique<CZipFileHeader>());
+    ZipArchiveLib::PushBack(m_headers, std::make_unique<CZipFileHeader>(), m_storage->GetArchivePath());
     return m_headers.back()->ReadCentral(*m_storage, *m_settings, signatureRead);
 }
 

@@ -21,7 +21,7 @@ public:
     /// What a caller can set for a kind of compressor.
     class COptions {
     public:
-        enum Type : int { deflate = 1, bzip2 = 2 };
+        enum Type : int { typeDeflate = 1, typeBzip2 = 2 };
         static constexpr std::uint32_t k_defaultBufferSize = 0x20000;
 
         virtual int GetType() const = 0;

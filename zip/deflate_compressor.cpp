@@ -233,7 +233,7 @@ void CDeflateCompressor::ReleaseLibrary() {
 int CDeflateCompressor::MapLibraryResult(int result) const {
     switch (result) {
         case Z_VERSION_ERROR:
-            return CZipException::zlibVersion;
+            return CZipException::zlibRelease;
         case Z_BUF_ERROR:
             return CZipException::zlibBuffer;
         case Z_MEM_ERROR:

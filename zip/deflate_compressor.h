@@ -12,7 +12,7 @@ class CDeflateCompressor : public CBaseLibCompressor {
 public:
     class COptions : public CBaseLibCompressor::COptions {
     public:
-        int GetType() const override { return deflate; }
+        int GetType() const override { return typeDeflate; }
         std::unique_ptr<CZipCompressor::COptions> Clone() const override;
 
         /// Who asks for more than the entry declares learns, by code 101, that its stream goes on.

@@ -34,7 +34,7 @@ public:
         zlibData = 504,
         zlibMemory = 505,  ///< also from a memory file
         zlibBuffer = 506,
-        zlibVersion = 507,
+        zlibRelease = 507,
         bzip2Sequence = 600,
         bzip2Parameter = 601,
         bzip2Memory = 602,

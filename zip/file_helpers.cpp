@@ -36,6 +36,10 @@ int FileExists(const CZipEnvironment& environment, const std::string& path) {
     return 0;
 }
 
+bool IsDirectory(const CZipEnvironment& environment, const std::string& path) {
+    return environment.names.is_enterable_folder(path);
+}
+
 bool SetFileTime(const CZipEnvironment& environment, const std::string& path, std::int64_t time) {
     return environment.names.set_modification_time(path, time == -1 ? environment.clock.now() : time);
 }

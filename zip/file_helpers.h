@@ -22,6 +22,9 @@ std::optional<std::uint32_t> GetFileSize(const CZipEnvironment& environment, con
 /// -1 for a folder, 1 for a file, 0 when there is nothing of that name.
 int FileExists(const CZipEnvironment& environment, const std::string& path);
 
+/// Whether the path names a folder that can be entered.
+bool IsDirectory(const CZipEnvironment& environment, const std::string& path);
+
 /// A time of -1 means now.
 bool SetFileTime(const CZipEnvironment& environment, const std::string& path, std::int64_t time);
 

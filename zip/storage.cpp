@@ -7,6 +7,7 @@
 #include "zip/bytes.h"
 #include "zip/exception.h"
 #include "zip/file_helpers.h"
+#include "zip/path_component.h"
 #include "zip/record_layout.h"
 
 using ZipArchiveLib::k_largestNumber;
@@ -47,6 +48,7 @@ void CZipStorage::Reset(const std::string& path) {
     m_segmentation = none;
     m_callback = nullptr;
     m_archivePath = path;
+    m_lastVolumeExtension = CZipPathComponent(path, vrl_platform::path_separator()).GetFileExtension();
 }
 
 void CZipStorage::OpenFile(const std::string& path, unsigned flags) {

@@ -102,6 +102,7 @@ public:
     int GetSegmentation() const { return m_segmentation; }
     std::uint16_t GetCurrentVolume() const { return m_currentVolume; }
     std::uint16_t GetLastVolume() const { return m_lastVolume; }
+    const std::string& GetLastVolumeExtension() const { return m_lastVolumeExtension; }
     int GetVolumeSize() const { return m_volumeSize; }
     std::uint32_t GetBytesBefore() const { return m_bytesBefore; }
     void SetBytesBefore(std::uint32_t bytes) { m_bytesBefore = bytes; }

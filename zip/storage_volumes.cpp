@@ -26,10 +26,16 @@ std::string CZipStorage::Folder() const {
     return folder.empty() ? "." : folder;
 }
 
+// The volumes lie beside the archive. The last one of a finished archive has the name that the caller gave;
+// until then it is not known which one that will be.
 std::string CZipStorage::VolumePath(std::uint16_t volume) const {
     const char separator = vrl_platform::path_separator();
     CZipPathComponent path(m_archivePath, separator);
-    path.SetFileExtension(volume + 1U < 100 ? Numbered("z%.2u", volume + 1U) : Numbered("z%u", volume + 1U));
+    const unsigned number = volume + 1U;
+    if (!m_newSegmented && volume == m_lastVolume)
+        path.SetFileExtension(m_lastVolumeExtension);
+    else
+        path.SetFileExtension(Numbered(number < 100 ? "z%.2u" : "z%u", number));
     const bool hasFolder = !path.GetFilePath().empty();
     return hasFolder ? path.GetFullPath() : std::string(".") + separator + path.GetFullPath();
 }
@@ -93,7 +99,6 @@ void CZipStorage::SetLastVolume(std::uint16_t volume) {
 }
 
 std::string CZipStorage::AskForVolume(std::uint16_t volume) const {
-    const bool isLast = volume == m_lastVolume;
     CZipVolumeCallback::Request request{CZipVolumeCallback::readVolume, 0, m_archivePath, volume + 1};
     if (m_segmentation == spanned) {
         if (m_callback == nullptr) Raise(CZipException::noVolumeCallback);
@@ -101,10 +106,8 @@ std::string CZipStorage::AskForVolume(std::uint16_t volume) const {
             CZipException::Raise(CZipException::stoppedByCallback, request.path);
         return m_archivePath;
     }
-    if (isLast)
-        request.volume = -1;
-    else
-        request.path = VolumePath(volume);
+    request.path = VolumePath(volume);
+    if (volume == m_lastVolume) request.volume = -1;
     while (m_callback != nullptr) {
         if (!m_callback->RequestVolume(request))
             CZipException::Raise(CZipException::stoppedByCallback, request.path);

@@ -71,7 +71,8 @@ TEST(ExtraField, CopiesAreDeep) {
     first.Add(1, 2);
     CZipExtraField second(first);
     second.Add(2, 0);
-    first = first;
+    const CZipExtraField& same = first;
+    first = same;
     EXPECT_EQ(first.GetCount(), 1U);
     EXPECT_EQ(second.GetCount(), 2U);
     EXPECT_NE(first.Find(1), second.Find(1));

@@ -56,6 +56,12 @@ TEST_F(FileHelpers, ExistsTellsFoldersFromFiles) {
     EXPECT_EQ(ZipArchiveLib::FileExists(environment, folder / "none"), 0);
 }
 
+TEST_F(FileHelpers, ADirectoryIsWhatCanBeEntered) {
+    EXPECT_TRUE(ZipArchiveLib::IsDirectory(environment, folder.Path().string()));
+    EXPECT_FALSE(ZipArchiveLib::IsDirectory(environment, folder.Write("a", "")));
+    EXPECT_FALSE(ZipArchiveLib::IsDirectory(environment, folder / "none"));
+}
+
 TEST_F(FileHelpers, DeletingRaises115OnRequest) {
     folder.Write("a", "");
     EXPECT_TRUE(ZipArchiveLib::RemoveFile(environment, folder / "a", true));

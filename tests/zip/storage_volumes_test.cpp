@@ -454,6 +454,7 @@ TEST_F(StorageVolumes, ADiskNumberThatMeansClosedIsRefused) {
 
 TEST_F(StorageVolumes, ReadsGoOverVolumes) {
     OpenFour();
+    EXPECT_EQ(storage.GetLastVolumeExtension(), "zip");
     EXPECT_EQ(Read(2), "ab");
     EXPECT_EQ(Read(8), "cdefghij");
     EXPECT_EQ(storage.GetCurrentVolume(), 3);
