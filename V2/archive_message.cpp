@@ -36,7 +36,7 @@ constexpr row k_rows[] = {
     {CZipException::zlibData, "the compressed data is damaged"},
     {CZipException::zlibMemory, "out of memory"},
     {CZipException::zlibBuffer, "the compressed data is cut off"},
-    {CZipException::zlibVersion, "zlib: another version than expected"},
+    {CZipException::zlibRelease, "zlib: another version than expected"},
     {CZipException::bzip2Sequence, "bzip2: sequence error"},
     {CZipException::bzip2Parameter, "bzip2: parameter error"},
     {CZipException::bzip2Memory, "out of memory"},

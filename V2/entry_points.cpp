@@ -1,6 +1,7 @@
 #include <memory>
 #include <sstream>
 #include <string_view>
+#include <utility>
 
 #include "V2/Vrl.h"
 #include "V2/library_stamp.h"
@@ -74,7 +75,7 @@ XMLDocumentResult Vrl::writeString() const {
     std::ostringstream os;
     const eqbx_error result = write_text(*this, os);
     std::wstring document;
-    if (result == qbxV2::EQBX_NO_ERROR) qbxV2::convert(&document, os.str());
+    if (result == qbxV2::EQBX_NO_ERROR) qbxV2::convert(&document, std::move(os).str());
     return {document, result};
 }
 

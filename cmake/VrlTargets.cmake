@@ -24,5 +24,7 @@ function(vrl_add_tests program)
     target_compile_features(${program} PRIVATE cxx_std_20)
     target_compile_definitions(${program} PRIVATE VRL_TEST_DATA="${PROJECT_SOURCE_DIR}/tests/data")
     target_link_libraries(${program} PRIVATE ${ARG_LIBRARIES} GTest::gtest_main vrl::warnings)
+    # Built once and run once: what the optimiser would gain in a test, its own work would lose.
+    target_compile_options(${program} PRIVATE $<$<CXX_COMPILER_ID:GNU,Clang>:-O0>)
     gtest_discover_tests(${program} DISCOVERY_TIMEOUT 60)
 endfunction()

@@ -42,6 +42,9 @@ public:
     /// fails.
     bool get_attribute_value(std::string* value, eqbx_whitespace mode);
     bool skip_attribute_value();
+    /// Whether the input ended where `get_attribute_name` last looked for the rest of a start tag: calling it
+    /// again would report the same for ever.
+    bool is_tag_cut() const { return m_tag_is_cut; }
     /// Finds an attribute from the read position on, and starts over with the first attribute either way.
     /// Without a prefix an attribute has the id of the default namespace here.
     bool get_named_attribute(const c_xml_local* scope, int ns_id, const std::string& local_name,
@@ -137,6 +140,7 @@ private:
     bool m_doctype_read = false;
     bool m_first_event_delivered = false;
     c_attribute_buffer m_attributes;
+    bool m_tag_is_cut = false;
     c_attribute_buffer m_ns_attributes;
     std::string m_scratch;
 

@@ -123,6 +123,7 @@ eqxp_xml_event c_xml::get_attribute_name(std::string* name, bool in_pi) {
         return EQXP_NAME;
     }
     const int c = m_getter.get_non_ws();
+    m_tag_is_cut = c < 0;
     if (c == '>') return EQXP_START_TAG_END;
     if (c == (in_pi ? '?' : '/') && m_getter.get_non_ws() == '>') return EQXP_END_TAG;
     return fail_not_well_formed("XML not well-formed");

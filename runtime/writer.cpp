@@ -187,7 +187,9 @@ void c_xml_writer::put(const char* text, std::size_t length) {
 void c_xml_writer::put(const char* text) { put(text, std::strlen(text)); }
 
 void c_xml_writer::put_indent() {
-    if (m_gathering) {
+    if (m_gathering && m_tab[0] != '\0' && m_tab[1] == '\0') {
+        m_pending.append(static_cast<std::size_t>(m_level), m_tab[0]);
+    } else if (m_gathering) {
         for (int i = 0; i < m_level; ++i) put(m_tab);
     } else {
         (*this)(true);

@@ -101,8 +101,8 @@ public:
         return *m_entries[i];
     }
 
-    T& append() { return adopt(m_entries.size(), new T()); }
-    T& append(const T& value) { return adopt(m_entries.size(), new T(value)); }
+    T& append() { return adopt_last(new T()); }
+    T& append(const T& value) { return adopt_last(new T(value)); }
     T& insert(unsigned i) { return adopt(i, new T()); }
     T& insert(unsigned i, const T& value) { return adopt(i, new T(value)); }
 
@@ -132,6 +132,16 @@ public:
     }
 
 private:
+    T& adopt_last(T* entry) {
+        try {
+            m_entries.push_back(entry);
+        } catch (...) {
+            delete entry;
+            throw;
+        }
+        return *entry;
+    }
+
     T& adopt(std::size_t i, T* entry) {
         const auto place = m_entries.begin() + static_cast<std::ptrdiff_t>(i < size() ? i : size());
         try {
