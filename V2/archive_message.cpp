@@ -12,7 +12,7 @@ struct row {
 
 constexpr row k_rows[] = {
     {CZipException::generic, "a step of the ZIP engine failed"},
-    {CZipException::badStructure, "this is no ZIP archive, or it is damaged or cut off"},
+    {CZipException::badStructure, "this is no ZIP archive, or it is damaged, cut off or of the ZIP64 form"},
     {CZipException::badCrc, "the data is not what was packed (its CRC differs)"},
     {CZipException::noSpannedCallback, "the archive is spread over several disks"},
     {CZipException::stoppedByCallback, "a volume of the archive was refused"},

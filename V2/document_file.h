@@ -128,6 +128,10 @@ struct [[nodiscard]] load_result : file_outcome {
 [[nodiscard]] VRL_API load_result load_document_from_memory(const void* bytes, std::size_t size,
                                                             const load_options& options = {});
 
+/// A path from wide text as this library has it: UTF-16 units, or whole code points where `wchar_t` has room.
+/// Whatever the locale; a path made of a std::wstring by itself may depend on it, and then throws.
+VRL_API std::filesystem::path path_from_wide(const std::wstring& path);
+
 struct save_options {
     /// `automatic` takes ".vrlz" and ".vrl" in any case; any other suffix is refused.
     file_format format = file_format::automatic;

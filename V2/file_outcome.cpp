@@ -4,6 +4,7 @@
 #include <system_error>
 
 #include "V2/archive_message.h"
+#include "platform/file_exchange.h"
 
 namespace vrl_v2 {
 namespace {
@@ -76,6 +77,8 @@ void place(file_outcome& outcome, const std::string& name) {
     }
     if (!where.empty()) outcome.message = where + ": " + outcome.message;
 }
+
+std::filesystem::path path_from_wide(const std::wstring& path) { return vrl_platform::path_from_wide(path); }
 
 std::string as_text(const std::filesystem::path& path) {
     const auto text = path.u8string();

@@ -15,6 +15,7 @@ struct row {
 
 constexpr row k_rows[] = {
     {qbxV2::EQBX_ATTRIBUTE_ALREADY_READ, "the attribute {item} is there twice"},
+    {qbxV2::EQBX_ATTRIBUTE_VALUE_UNREADABLE, "the attribute {item} holds a reference to nothing"},
     {qbxV2::EQBX_BAD_END_OF_ELEMENT, "{item} was expected to end, but found {found}"},
     {qbxV2::EQBX_BAD_CHOICE, "nothing was chosen for {item}"},
     {qbxV2::EQBX_ELEMENT_NOT_FOUND, "the document does not begin with Vrl:Vrl, but with {item}"},
@@ -92,6 +93,8 @@ std::string report_message(const qbxV2::c_xml_reader& reader, qbxV2::c_string_st
     }
     if (code == qbxV2::EQBX_MANDATORY_ELEMENT_MISSING && item == found(reader)) {
         text = "{item} does not stand where it should";
+    } else if (code == qbxV2::EQBX_ELEMENT_VALUE_UNREADABLE && cause(reader, code).empty()) {
+        text = "the value of {item} holds a reference to nothing";
     } else if (code == qbxV2::EQBX_UNEXPECTED_END && item.empty()) {
         text = "there is no element in the document";
     } else if (text.empty()) {

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <filesystem>
+#include <string>
 
 #include "platform/file_descriptors.h"
 
@@ -39,6 +40,9 @@ public:
     /// flush.
     virtual int commit_folder(const std::filesystem::path& path) = 0;
 };
+
+/// A path of UTF-16 units, or of whole code points where `wchar_t` has room for them, whatever the locale.
+std::filesystem::path path_from_wide(const std::wstring& path);
 
 /// The system's own. Lives as long as the process.
 file_exchange& native_file_exchange();

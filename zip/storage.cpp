@@ -150,7 +150,7 @@ std::string CZipStorage::Close(bool afterException) {
         if (m_newSegmented && m_segmentation == split) FinishSplit();
     }
     const Ending ending{*this};
-    const std::string path = m_stream ? m_file->GetFilePath() : m_archivePath;
+    std::string path = m_stream ? m_file->GetFilePath() : m_archivePath;
     if (m_stream) return path;
     try {
         if (!afterException && !m_readOnly && (!IsSegmented() || m_newSegmented)) m_file->Flush();

@@ -12,6 +12,7 @@
 
 #include "platform/clock.h"
 #include "platform/entropy.h"
+#include "platform/text_encoding.h"
 
 namespace vrl_platform {
 namespace {
@@ -82,7 +83,7 @@ public:
         made.target = resolve(given);
         struct stat status {};
         const bool exists = ::stat(made.target.c_str(), &status) == 0;
-        if (!exists && errno != ENOENT) made.error = errno;
+        if (!exists && (errno != ENOENT || given.empty())) made.error = errno;
         if (exists) made.error = refusal(made.target, status);
         if (made.error != 0) return made;
         make_file(made, exists ? S_IRUSR | S_IWUSR : 0666);
@@ -120,6 +121,8 @@ private:
 };
 
 }  // namespace
+
+fs::path path_from_wide(const std::wstring& path) { return {utf8_from_wide(path)}; }
 
 file_exchange& native_file_exchange() {
     static posix_file_exchange exchange;

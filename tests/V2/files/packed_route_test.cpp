@@ -11,7 +11,7 @@
 #include <limits>
 #include <new>
 
-#include "documents.h"
+#include "tests/V2/documents.h"
 #include "tests/zip/raw_archive.h"
 #include "tests/zip/support.h"
 #include "zip/zip_archive.h"
