@@ -121,6 +121,85 @@ TEST(DamagedDocument, IsReadOrRefusedWithAnyByteGone) {
     }
 }
 
+/// Everything that a reading shows: its code, and each report with line and item.
+std::string trace(const std::string& xml, bool use_runs, const vrl_test::answer& reply) {
+    const exact_block block(xml, xml.size());
+    vrl_test::recording_reader reader(block.data(), block.size(), reply);
+    reader.use_runs(use_runs);
+    Vrl document;
+    std::string text = std::to_string(document.unmarshal(reader));
+    for (const auto& report : reader.reports()) text += "\n" + report.message;
+    return text + "\n" + std::to_string(document.size_Color());
+}
+
+// A run of bytes and one character at a time are two ways through the same scanner.
+TEST(DamagedDocument, IsReadAlikeOnBothPaths) {
+    const std::string xml = dense_document();
+    const std::string bytes("<>\"&/x \0\xFF\n\r", 11);
+    std::size_t turn = 0;
+    for (std::size_t at = 0; at < xml.size(); at += 5) {
+        std::string changed = xml;
+        changed[at] = bytes[turn++ % bytes.size()];
+        for (const std::string& damaged : {xml.substr(0, at), xml.substr(at), changed}) {
+            // Each answer forgives a little longer, and then no more: no report may go on for ever.
+            for (const int patience : {0, 1, 5}) {
+                const auto reply = [patience, seen = 0](const vrl_test::report& r) mutable {
+                    return seen++ < patience ? qbxV2::EQBX_NO_ERROR : r.code;
+                };
+                ASSERT_EQ(trace(damaged, true, reply), trace(damaged, false, reply)) << damaged;
+            }
+        }
+    }
+}
+
+TEST(Fragment, IsReadToItsEnd) {
+    for (const char* text : {" ",
+                             " text",
+                             "<",
+                             "<a",
+                             "</",
+                             "</>",
+                             "</a>",
+                             "<!x>",
+                             "<!",
+                             "<!-",
+                             "<!--",
+                             "<!-- -->",
+                             "<?",
+                             "<?x",
+                             "<?xml",
+                             "<?xml version=\"1.0\"",
+                             "<![CDATA[",
+                             "<![CDATA[]]>",
+                             "<!DOCTYPE",
+                             "<!DOCTYPE a [",
+                             "<!DOCTYPE a [<!ENTITY",
+                             "<Vrl:Vrl",
+                             "<Vrl:Vrl ",
+                             "<Vrl:Vrl /",
+                             "<Vrl:Vrl a",
+                             "<Vrl:Vrl a=",
+                             "<Vrl:Vrl a='1'",
+                             "<Vrl:Vrl a='1' /",
+                             "<Vrl:Vrl a='1' ?>",
+                             "<Vrl:Vrl / >",
+                             "<Vrl:Vrl>&",
+                             "<Vrl:Vrl>&a",
+                             "<Vrl:Vrl>&#",
+                             "<Vrl:Vrl>&#x110000;",
+                             "<Vrl:Vrl>&#0;",
+                             "<Vrl:Vrl xsi:nil='",
+                             "<Vrl:Vrl xmlns:Vrl='&'/>",
+                             "\xEF\xBB\xBF",
+                             "\xFF\xFE",
+                             "\xFE\xFF",
+                             "<Vrl:Preamble><Vrl:Header><Vrl:Creator"}) {
+        const exact_block block(text, std::char_traits<char>::length(text));
+        EXPECT_NE(Vrl().unmarshal(block.data(), static_cast<unsigned>(block.size())), 0) << text;
+        EXPECT_LT(reports_of_a_patient_reader(text), 100) << text;
+    }
+}
+
 TEST(Hostile, AttributesOfOneTagAreReadInTheirNumber) {
     std::string attributes;
     for (int i = 0; i < 20000; ++i) attributes += " a" + std::to_string(i) + "=\"1\"";

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <algorithm>
+#include <cstddef>
 #include <functional>
 #include <string>
 #include <utility>
@@ -30,7 +31,9 @@ inline eqbx_error forgive(const report&) { return qbxV2::EQBX_NO_ERROR; }
 class recording_reader : public qbxV2::c_xml_reader_memory {
 public:
     recording_reader(const std::string& text, answer reply)
-        : c_xml_reader_memory(text.data(), text.size()), m_reply(std::move(reply)) {
+        : recording_reader(text.data(), text.size(), std::move(reply)) {}
+    recording_reader(const char* data, std::size_t size, answer reply)
+        : c_xml_reader_memory(data, size), m_reply(std::move(reply)) {
         add_namespace_mapping("Vrl", vrl_v2::k_document_namespace_uri);
         add_namespace_mapping("xsi", "http://www.w3.org/2001/XMLSchema-instance");
     }

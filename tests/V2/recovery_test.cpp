@@ -120,6 +120,11 @@ TEST(BrokenXml, IsReportedWithTheScannersCode) {
                 {"<Vrl:Vrl a/>", 23},
                 {vrl_test::document("<>"), 12},
                 {vrl_test::document("<1/>"), 23},
+                // Faults without a report of the scanner's own: what stands there is no end of the element.
+                {vrl_test::document("</>"), 10},
+                {vrl_test::document("<!x>"), 10},
+                {"</>", 16},
+                {"<!x>", 16},
                 {"<?xml version=\"1.2\"?><a/>", 14},
                 {"<?xml version=\"1.0\" standalone=\"no\"?><a/>", 13},
                 {"<?xml encoding=\"UTF-8\"?><a/>", 13},
