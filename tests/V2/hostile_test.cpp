@@ -234,7 +234,9 @@ TEST(Hostile, EntitiesThatMultiplyAreStopped) {
         reader.set_max_entity_expansion(100000);
         EXPECT_NE(Vrl().unmarshal(reader), 0);
     }
-    EXPECT_LT(reports_of_a_patient_reader(in_text), patient_reader::k_patience);
+    for (const std::string& xml : {in_attribute, in_text}) {
+        EXPECT_LT(reports_of_a_patient_reader(xml), patient_reader::k_patience);
+    }
 }
 
 TEST(Hostile, EntitiesWithinTheLimitAreRead) {
@@ -256,6 +258,20 @@ TEST(Hostile, EntityOfItselfIsStopped) {
                                                  "Owner", vrl_test::element("Company", "&e;"))));
         EXPECT_NE(Vrl().unmarshal(xml), 0) << value;
         EXPECT_LT(reports_of_a_patient_reader(xml), patient_reader::k_patience) << value;
+    }
+}
+
+// The fault stands in the value, behind a start tag that was taken in whole: the tag has no end any more.
+TEST(Hostile, EntityOfItselfInAnAttributeIsStopped) {
+    for (const char* value : {"&e;", "&f;", "&e", "x&e;x"}) {
+        const std::string dtd =
+            std::string("<!DOCTYPE Vrl [<!ENTITY e \"") + value + "\"><!ENTITY f \"&e;\">]>";
+        for (const char* attributes : {" PaletteName=\"&e;\"", " PaletteName=\"&e;\" UniqueID=\"u\""}) {
+            const std::string xml =
+                dtd + vrl_test::document(vrl_test::element("Palette", vrl_test::history(), attributes));
+            EXPECT_NE(Vrl().unmarshal(xml), 0) << value;
+            EXPECT_LT(reports_of_a_patient_reader(xml), patient_reader::k_patience) << value;
+        }
     }
 }
 

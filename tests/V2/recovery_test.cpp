@@ -152,6 +152,18 @@ TEST(BrokenXml, DeliversNoElementBehindAFatalFault) {
     }
 }
 
+TEST(BrokenXml, CanBeForgivenWithinATag) {
+    ColorType color;
+    const std::string xml = "<Vrl:Color ColorName=\"c\" ?>" + history() + vrl_test::cmyk() + "</Vrl:Color>";
+    EXPECT_EQ(vrl_test::read_element(color, xml, forgive).code, 0);
+    EXPECT_EQ(color.size_ColorSpace(), 1u);
+    OwnerType owner;
+    const std::string tag = "<Vrl:Owner ?>" + element("Company", "c") + "</Vrl:Owner>";
+    EXPECT_EQ(vrl_test::read_element(owner, tag).code, 23);
+    EXPECT_EQ(vrl_test::read_element(owner, tag, forgive).code, 0);
+    EXPECT_EQ(owner.size_Company(), 1u) << "a class without attributes, too";
+}
+
 TEST(BrokenXml, CanBeForgivenInTheMiddle) {
     ColorSpaceCMYKType space;
     const std::string xml =
