@@ -17,6 +17,9 @@ namespace qbxV2 {
 /// an operation answers through an `overflow` pointer, that may be null; otherwise it is stored in every
 /// case.
 class VRL_API c_decimal {
+    template <typename T>
+    using if_integer = std::enable_if_t<std::is_integral_v<T>, int>;
+
 public:
     /// Digits behind the point that a conversion from double gives at most.
     static constexpr unsigned int k_max_precision = 15;
@@ -28,13 +31,19 @@ public:
     /// `value` times ten to the power of minus `scale`; the fraction has `scale` digits. A negative scale
     /// appends zeros; when digits, zeros and terminator pass 30 bytes the process ends.
     c_decimal(long value, int scale = 0);
-    template <typename Integer, std::enable_if_t<std::is_integral_v<Integer>, int> = 0>
-    c_decimal(Integer value, int scale = 0) : c_decimal(static_cast<long>(value), scale) {}
+    template <typename Integer, if_integer<Integer> = 0>
+    c_decimal(Integer value) : c_decimal(static_cast<long>(value)) {}
+    template <typename Integer, typename Scale, if_integer<Integer> = 0, if_integer<Scale> = 0>
+    c_decimal(Integer value, Scale scale) : c_decimal(static_cast<long>(value), static_cast<int>(scale)) {}
     /// `value` with `precision` digits behind the point, at most 15. Printed in the process's locale: where
     /// that has a decimal comma the fraction is lost. Infinity and NaN give 0.
     c_decimal(double value, unsigned int precision = k_max_precision);
     /// The same; a negative precision counts as one above 15.
-    c_decimal(double value, int precision) : c_decimal(value, static_cast<unsigned int>(precision)) {}
+    template <typename Precision, if_integer<Precision> = 0>
+    c_decimal(double value, Precision precision) : c_decimal(value, static_cast<unsigned int>(precision)) {}
+    /// An `unsigned int` is a precision behind a whole number, too.
+    template <typename Integer, if_integer<Integer> = 0>
+    c_decimal(Integer value, unsigned int precision) : c_decimal(static_cast<double>(value), precision) {}
     ~c_decimal() = default;
 
     c_decimal& operator=(const c_decimal& other) = default;
@@ -42,7 +51,7 @@ public:
     c_decimal& operator=(const char* text);
     /// With 15 digits behind the point.
     c_decimal& operator=(double value);
-    template <typename Integer, std::enable_if_t<std::is_integral_v<Integer>, int> = 0>
+    template <typename Integer, if_integer<Integer> = 0>
     c_decimal& operator=(Integer value) {
         return *this = static_cast<double>(value);
     }

@@ -110,6 +110,18 @@ TEST(Decimal, ConstructorsOfTheInterfaceCompile) {
     EXPECT_EQ(text(value), "12");
 }
 
+TEST(Decimal, TakesEveryPairOfNumbersThatNamesAConstructor) {
+    EXPECT_EQ(text(c_decimal(12345L, 2)), "123.45");
+    EXPECT_EQ(text(c_decimal(12345U, 2)), "123.45");
+    EXPECT_EQ(text(c_decimal(12345, 2L)), "123.45");
+    EXPECT_EQ(text(c_decimal(5, sizeof(char))), ".5");
+    EXPECT_EQ(text(c_decimal(1.5, 2L)), "1.50");
+    EXPECT_EQ(text(c_decimal(1.5, sizeof(char))), "1.5");
+    EXPECT_EQ(text(c_decimal(1.5F, 2U)), "1.50");
+    EXPECT_EQ(text(c_decimal(5, 2U)), "5.00") << "an unsigned int is a precision";
+    EXPECT_EQ(text(c_decimal(5L, 2U)), "5.00");
+}
+
 TEST(DecimalDeathTest, EndsTheProcessWhenZerosPassThirtyBytes) {
     EXPECT_EQ(text(c_decimal(0, -28)).size(), 1U);
     EXPECT_DEATH(c_decimal(1, -29), "");
