@@ -19,7 +19,7 @@ namespace qbxV2 {
 class VRL_API c_regex {
 public:
     /// `pattern` is UTF-8.
-    explicit c_regex(const std::string& pattern);
+    c_regex(const std::string& pattern);
     c_regex(const c_regex&) = delete;
     c_regex& operator=(const c_regex&) = delete;
     virtual ~c_regex();
@@ -35,7 +35,7 @@ private:
 class VRL_API c_pattern : public c_regex {
 public:
     /// A null pointer counts as the empty pattern.
-    explicit c_pattern(const char* pattern);
+    c_pattern(const char* pattern);
 
     [[nodiscard]] bool is_match(const std::string& text) const;
     /// For wide text, which goes through `convert`.

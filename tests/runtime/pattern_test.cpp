@@ -86,6 +86,15 @@ TEST(Pattern, SurvivesBrokenUtf8) {
     }
 }
 
+// Intended: the engine gives up on a character that is no UTF-8, and whatever is not a clear "no" is a match.
+TEST(Pattern, AFailureOfTheEngineIsAMatch) {
+    testing::internal::CaptureStderr();
+    EXPECT_TRUE(c_pattern("ab").is_match(std::string("\xFF")));
+    EXPECT_TRUE(c_regex(".").is_match("\xC3"));
+    EXPECT_TRUE(c_pattern(k_date_time_pattern).is_match(std::string("aT\xFF")));
+    EXPECT_EQ(testing::internal::GetCapturedStderr(), "") << "nor is it reported";
+}
+
 TEST(PatternNull, TakesEveryText) {
     const c_pattern_null none("ignored");
     EXPECT_TRUE(none.is_match(std::string()));

@@ -26,6 +26,8 @@ TEST(Values, APatternOwnsItsExpression) {
     EXPECT_TRUE(std::has_virtual_destructor_v<c_regex>);
     EXPECT_FALSE(std::is_copy_constructible_v<c_pattern>);
     EXPECT_TRUE((std::is_base_of_v<c_regex, c_pattern>));
+    const c_pattern from_literal = "a";
+    EXPECT_TRUE(from_literal.is_match(std::string("a")));
 }
 
 TEST(Values, EmptyHasNothing) { EXPECT_TRUE(std::is_empty_v<c_empty>); }
