@@ -257,6 +257,9 @@ INSTANTIATE_TEST_SUITE_P(Values, DurationComparison,
                                          Compared{"P1M", "P30D", '?'}, Compared{"P1M", "P29D", '?'},
                                          Compared{"P1M", "P28D", '>'}, Compared{"P1M", "P27D", '>'},
                                          Compared{"P1M", "P31D", '>'},
+                                         // Hours count once they are days.
+                                         Compared{"P1M", "P30DT23H", '?'}, Compared{"P1M", "P30DT24H", '>'},
+                                         Compared{"P1M", "P27DT23H", '>'}, Compared{"P13M", "P1M", '>'},
                                          // The month fields agree, so the fields decide.
                                          Compared{"P1Y", "P365D", '>'}, Compared{"P12M", "P365D", '>'},
                                          Compared{"P2M", "P1M", '>'}, Compared{"P1Y1M", "P1Y30D", '?'},
