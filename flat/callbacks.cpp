@@ -1,5 +1,7 @@
 #include "flat/callbacks.h"
 
+#include <string>
+
 #include "flat/vrl_flat_base.h"
 
 namespace vrl_flat {
@@ -14,11 +16,15 @@ constexpr int k_argument_null = 1;
 
 }  // namespace
 
-void report_argument_null(const std::string& message) {
+void report_argument_null(const char* message) {
     // A caller that forgot to register gets the null result without the exception, and not a crash.
     if (g_argument_exceptions[k_argument_null] != nullptr) {
-        g_argument_exceptions[k_argument_null](message.c_str(), nullptr);
+        g_argument_exceptions[k_argument_null](message, nullptr);
     }
+}
+
+void report_null(const char* type, const char* reference) {
+    report_argument_null((std::string(type) + reference).c_str());
 }
 
 }  // namespace vrl_flat

@@ -48,10 +48,6 @@ Result nothing() {
     if constexpr (!std::is_void<Result>::value) return Result();
 }
 
-inline void report_null(const char* type, const char* reference) {
-    report_argument_null(std::string(type) + reference);
-}
-
 inline constexpr char k_null_reference[] = " & type is null";
 inline constexpr char k_null_const_reference[] = " const & type is null";
 inline constexpr char k_null_text[] = "null string";

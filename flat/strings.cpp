@@ -1,5 +1,6 @@
 #include "flat/strings.h"
 
+#include <algorithm>
 #include <atomic>
 #include <cstdint>
 #include <cstdlib>
@@ -30,12 +31,13 @@ std::size_t prefix() {
 
 /// Room for `length` bytes and a zero unit; the length is written, the text is not.
 char* allocate(std::size_t length) {
-    const std::size_t needed = prefix() + length + sizeof(char16_t);
-    const std::size_t size = (needed + k_granule - 1) / k_granule * k_granule;
     if (length > UINT32_MAX) return nullptr;
+    const std::size_t ahead = prefix();
+    const std::size_t needed = ahead + length + sizeof(char16_t);
+    const std::size_t size = (needed + k_granule - 1) / k_granule * k_granule;
     auto* const block = static_cast<char*>(std::malloc(size));
     if (block == nullptr) return nullptr;
-    char* const text = block + prefix();
+    char* const text = block + ahead;
     const auto counted = static_cast<std::uint32_t>(length);
     std::memcpy(text - k_length_size, &counted, k_length_size);
     std::memset(text + length, 0, sizeof(char16_t));
@@ -54,8 +56,14 @@ std::size_t unit_count(const std::wstring& text) {
 }  // namespace
 
 char16_t* new_text(const std::wstring& text) {
-    auto* const made = reinterpret_cast<char16_t*>(allocate(unit_count(text) * sizeof(char16_t)));
+    const std::size_t count = unit_count(text);
+    auto* const made = reinterpret_cast<char16_t*>(allocate(count * sizeof(char16_t)));
     if (made == nullptr) return nullptr;
+    // Almost every text is of single units: a loop without a branch, which the compiler does in blocks.
+    if (count == text.size()) {
+        std::transform(text.begin(), text.end(), made, [](wchar_t c) { return static_cast<char16_t>(c); });
+        return made;
+    }
     char16_t* to = made;
     for (const wchar_t c : text) {
         const auto code = static_cast<std::uint32_t>(c);
