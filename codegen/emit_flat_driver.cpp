@@ -14,6 +14,23 @@ void bind_list(printer& out, const std::string& name) {
     bind(out, "clear", "clear_" + name);
 }
 
+/// The functions that take a value by pointer, given none.
+void bind_nulls(printer& out, const member_plan& member) {
+    const printer::values holes = {{"X", member.name}};
+    if (member.kind != member_kind::value_list && member.kind != member_kind::any_list) {
+        out.print("        m.given_null = {[](void* o) { return CSharp_$C$_set_$X$(o, nullptr); }};\n",
+                  holes);
+        return;
+    }
+    out.print(R"(        m.given_null = {[](void* o) { return CSharp_$C$_append_$X$(o, nullptr); },
+                        [](void* o) { return CSharp_$C$_insert_$X$(o, 0, nullptr); }};
+)",
+              holes);
+    if (member.kind == member_kind::any_list) return;
+    out.print("        m.given_null.push_back([](void* o) { return CSharp_$C$_set_$X$(o, 0, nullptr); });\n",
+              holes);
+}
+
 /// What crosses differs by type: the text of a document on one side, the C type on the other.
 void bind_value(printer& out, const member_plan& member) {
     const bool list = member.kind == member_kind::value_list;
@@ -21,6 +38,7 @@ void bind_value(printer& out, const member_plan& member) {
         member.value.kind == value_kind::date_time || member.value.kind == value_kind::binary;
     const printer::values holes = {
         {"X", member.name}, {"taken", structured ? "text_of<" + member.value.type + ">" : "taken_text"}};
+    if (structured || member.value.kind == value_kind::text) bind_nulls(out, member);
     if (list) {
         out.print(R"(        m.set = [](void* o, const std::string& t) {
             return CSharp_$C$_append_$X$(o, crossing_value(t, &CSharp_$C$_append_$X$).get());
@@ -65,7 +83,7 @@ void bind_object(printer& out, const std::string& name, bool list) {
     bind_list(out, name);
 }
 
-void bind_any(printer& out) {
+void bind_any(printer& out, const member_plan& member) {
     out.print(
         R"(        m.set = [](void* o, const std::string& t) { return CSharp_$C$_append_any(o, t.c_str()); };
         m.get = [](void* o, uint32_t i) { return taken_text(vrl_revision_any(o, i, 2)); };
@@ -73,7 +91,8 @@ void bind_any(printer& out) {
             return CSharp_$C$_insert_any(o, i, t.c_str());
         };
 )");
-    bind_list(out, "any");
+    bind_nulls(out, member);
+    bind_list(out, member.name);
 }
 
 void bind_member(printer& out, const member_plan& member) {
@@ -96,7 +115,7 @@ void bind_member(printer& out, const member_plan& member) {
             bind_object(out, member.name, true);
             break;
         case member_kind::any_list:
-            bind_any(out);
+            bind_any(out, member);
             break;
     }
     if (member.has_presence_accessors()) {

@@ -165,7 +165,8 @@ void add_documents(flat_collector& out) {
 void add_identity(flat_collector& out, const class_plan& made) {
     out.call("clone", "$C$_clone", "void*", "", "o.clone()");
     out.call("getid", "$C$_getid", "const char*", "", "o.getid()");
-    out.call("has_id", "$C$_has_id", "int32_t", ", const char* id", "o.has_id(id)");
+    out.add("has_id", "$C$_has_id", "int32_t", "void* self, const char* id",
+            "call_with_text<$C$>(self, id, [&]($C$& o) { return o.has_id(id); })");
     out.add("id_get", "$C$_id_get", "const char*", "void", "$C$::id");
     out.add("id_set", "$C$_id_set", "void", "const char* id", "replace_identity($C$::id, id)");
     if (made.factory.empty()) return;

@@ -23,6 +23,8 @@ struct flat_member {
     int32_t (*set_at)(void* self, uint32_t i, const std::string& text) = nullptr;
     int32_t (*isset)(void* self) = nullptr;
     void (*unset)(void* self) = nullptr;
+    /// The functions that store a text or a structured value, called with null for it.
+    std::vector<int32_t (*)(void* self)> given_null;
     int32_t (*getenum)(void* self) = nullptr;
     int32_t (*setenum)(void* self, int32_t number) = nullptr;
 
@@ -73,7 +75,7 @@ std::string written(const qbxV2::c_datetime& value);
 std::string written(const qbxV2::c_binary& value);
 template <class T>
 std::string text_of(void* value) {
-    return written(*static_cast<const T*>(value));
+    return value == nullptr ? "(null)" : written(*static_cast<const T*>(value));
 }
 template <class T>
 std::enable_if_t<std::is_arithmetic<T>::value, std::string> taken_text(T value) {

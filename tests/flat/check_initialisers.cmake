@@ -1,0 +1,18 @@
+cmake_minimum_required(VERSION 3.25)
+# The exports add nothing to what runs when the library is loaded: no object of theirs has a section of functions to
+# be called then.
+string(REPLACE "|" ";" objects "${VRL_OBJECTS}")
+list(LENGTH objects count)
+if(count LESS 10)
+    message(FATAL_ERROR "only ${count} objects to look at")
+endif()
+foreach(object IN LISTS objects)
+    execute_process(COMMAND ${VRL_OBJDUMP} -h ${object} OUTPUT_VARIABLE sections COMMAND_ERROR_IS_FATAL ANY)
+    if(NOT sections MATCHES "\\.text")
+        message(SEND_ERROR "${object}: no sections are told")
+    endif()
+    if(sections MATCHES "\\.(init_array|preinit_array|ctors)")
+        message(SEND_ERROR "${object} has a ${CMAKE_MATCH_0}")
+    endif()
+endforeach()
+message(STATUS "${count} objects have nothing to initialise")
