@@ -20,14 +20,14 @@ bool matches(const Row& row, int id, const char* name, std::size_t size) {
            std::memcmp(row.name, name, size) == 0;
 }
 
-/// XML Namespaces, production 4 NCName, of ASCII only.
+/// XML Namespaces, production 4 NCName, of ASCII only. Intended: a colon may come first.
 bool is_ascii_ncname(const char* name, std::size_t size) {
     const auto byte_passes = [](char c, unsigned mask) {
-        return c != ':' && static_cast<unsigned char>(c) < 0x80 && detail::value_is(c, mask);
+        return static_cast<unsigned char>(c) < 0x80 && detail::value_is(c, mask);
     };
     if (size == 0 || !byte_passes(name[0], detail::cc_name_start)) return false;
     for (std::size_t i = 1; i < size; ++i) {
-        if (!byte_passes(name[i], detail::cc_name)) return false;
+        if (name[i] == ':' || !byte_passes(name[i], detail::cc_name)) return false;
     }
     return true;
 }

@@ -99,7 +99,8 @@ INSTANTIATE_TEST_SUITE_P(Names, ValidQName,
                                          QName{"x", false}, QName{"", false}, QName{"p:1", false},
                                          QName{"p:-x", false}, QName{"p:x y", false},
                                          QName{"p:\xC3\xA9", false}, QName{"\xC3\xA9:x", false},
-                                         QName{"1:x", false}, QName{":x", false}));
+                                         QName{"1:x", false}, QName{":x", false}, QName{"p::x", true},
+                                         QName{"p:::x", false}, QName{"p:x:y", false}));
 
 TEST(ValidQNameDefault, WithoutAPrefixNeedsADefaultNamespace) {
     Reading r("<a xmlns='u'/>");
