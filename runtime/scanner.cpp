@@ -1,7 +1,6 @@
 #include "runtime/scanner.h"
 
 #include "runtime/character_class.h"
-#include "runtime/open_elements.h"
 
 namespace qbxV2 {
 

@@ -31,9 +31,9 @@ bool c_xml::skip_element_body(const std::string& name) {
             }
             case EQXP_END_TAG:
                 if (!open.top_is(found)) {
-                    m_getter.error(EQBX_ET_ERROR, EQBX_NOT_WELL_FORMED,
-                                   std::string("Element start tag (") + open.top() + ") and end tag (" +
-                                       found + ") do not match");
+                    m_getter.error(
+                        EQBX_ET_ERROR, EQBX_NOT_WELL_FORMED,
+                        "Element start tag (" + open.top() + ") and end tag (" + found + ") do not match");
                     return false;
                 }
                 open.pop();

@@ -86,8 +86,15 @@ INSTANTIATE_TEST_SUITE_P(Broken, AnyElement,
                                          Copy{"something behind the name of an end tag", "<a></a x>",
                                               "false <a>"}));
 
+TEST(AnyElementNames, AreComparedBehindANulToo) {
+    const std::string whole("<a><b\0c>x</b\0c></a>", 21);
+    EXPECT_EQ(copied(whole), "true <a><b\\x00c>x</b\\x00c></a>");
+    EXPECT_EQ(copied(std::string("<a><b\0c></b\0d></a>", 20)), "false <a><b\\x00c>");
+}
+
 TEST(AnyElementModes, ApplyToTextPieces) {
     EXPECT_EQ(copied("<a> x \n y <b> </b></a>", EQBX_WS_COLLAPSE), "true <a>x y<b></b></a>");
+    EXPECT_EQ(copied("<a>x <b/> y</a>", EQBX_WS_COLLAPSE), "true <a>x<b/>y</a>") << "each piece by itself";
     EXPECT_EQ(copied("<a>\tx\n<b/></a>", EQBX_WS_REPLACE), "true <a> x <b/></a>");
 }
 
