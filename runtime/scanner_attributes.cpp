@@ -143,7 +143,11 @@ bool c_xml::get_attribute_value(std::string* value, eqbx_whitespace mode) {
         const char stop = *to;
         m_attributes.advance();
         if (stop == '\0') return true;
-        if (!expand_reference(reader, value)) return false;
+        if (!expand_reference(reader, value)) {
+            // Whoever goes on finds the next attribute, not the rest of this value as one.
+            m_attributes.set_position(m_attributes.behind_text(m_attributes.position()));
+            return false;
+        }
     }
 }
 

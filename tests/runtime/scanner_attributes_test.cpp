@@ -130,6 +130,19 @@ TEST(SkipAttributeValue, StepsOverAValueWithoutLookingAtIt) {
     EXPECT_EQ(at.value, "2");
 }
 
+TEST(AttributeValue, ThatFailsIsFollowedByTheNextAttribute) {
+    for (const char* const bad : {"x&u;y", "&u;", "&#;", "1&#x110000;2&u;"}) {
+        AtElement at(reading_paths::join({"<a b='", bad, "' c='2'/>"}));
+        at.xml.get_attribute_name(&at.name, false);
+        EXPECT_FALSE(at.xml.get_attribute_value(&at.value, EQBX_WS_PRESERVE));
+        EXPECT_EQ(at.xml.get_attribute_name(&at.name, false), EQXP_NAME);
+        EXPECT_EQ(at.name, "c");
+        EXPECT_TRUE(at.xml.get_attribute_value(&at.value, EQBX_WS_PRESERVE));
+        EXPECT_EQ(at.value, "2");
+        EXPECT_EQ(at.xml.get_attribute_name(&at.name, false), EQXP_END_TAG);
+    }
+}
+
 TEST(NamedAttribute, IsFoundByNamespaceAndLocalNameAndReadingStartsOver) {
     AtElement at("<a xmlns:p='u' b='1' p:c='&#50;' c='3'/>");
     EXPECT_TRUE(at.xml.get_named_attribute(&at.scope, 1000, "c", &at.value));
@@ -225,6 +238,12 @@ TEST(NamespaceDeclarations, AnEmptyDefaultIsNoNamespaceButAnEmptyPrefixedOneIsAU
     EXPECT_EQ(at.scope.find_namespace_id(""), 1);
     EXPECT_EQ(at.scope.find_namespace_id("p"), 1000);
     EXPECT_STREQ(at.xml.find_namespace_from_id(1000), "");
+}
+
+TEST(NamespaceDeclarations, AreLookedAtAfterTheirReferencesAreExpanded) {
+    AtElement at("<!DOCTYPE a [<!ENTITY e ''>]><a xmlns='&e;' xmlns:p='&e;'/>");
+    EXPECT_EQ(at.scope.find_namespace_id(""), 1) << "nothing is left of the default one";
+    EXPECT_EQ(at.scope.find_namespace_id("p"), 1000);
 }
 
 TEST(NamespaceDeclarations, ExpandReferencesInTheUri) {
