@@ -4,6 +4,7 @@
 
 #include <filesystem>
 #include <fstream>
+#include <type_traits>
 
 #include "reading_paths.h"
 #include "runtime/utf8_decoder.h"
@@ -88,6 +89,8 @@ TEST(ReadMemory, RewindStartsOverAndCopiesGoOnByThemselves) {
     copy = source;
     EXPECT_EQ(rest_of(copy), "abc");
 }
+
+TEST(ReadMemory, NeedsItsBytes) { EXPECT_FALSE(std::is_default_constructible_v<c_read_memory>); }
 
 TEST(ReadString, ReadsTheCharactersOfTheString) {
     const std::string text("a\0b", 3);

@@ -3,6 +3,7 @@
 #include <gtest/gtest.h>
 
 #include "reading_paths.h"
+#include "runtime/scanner.h"
 #include "scan_trace.h"
 
 namespace {
@@ -44,6 +45,8 @@ INSTANTIATE_TEST_SUITE_P(
                "<a> <b/> </a> EOF"},
         Subset{"entity references on use", "[<!ENTITY e '&f;'><!ENTITY f 'x'>]>", k_x},
         Subset{"what is behind the value is passed over", "[<!ENTITY e 'x' NDATA '>' >]>", k_x},
+        Subset{"an instruction that begins and ends in one word goes on to the next end of one",
+               "[<?pi?><!ENTITY e 'y'>?><!ENTITY f 'x'><!ENTITY e '&f;'>]>", k_x},
         Subset{"a line break in the text", "[<!ENTITY e '1\n2'>]>", "<a> '1\\x0A2' </a> EOF"}));
 
 INSTANTIATE_TEST_SUITE_P(
@@ -116,6 +119,20 @@ TEST(InternalSubsetEnd, OfInputIsAFailureAtAnyPlace) {
 TEST(InternalSubsetLines, OfEntityTextDontCount) {
     EXPECT_EQ(events("<!DOCTYPE a [<!ENTITY e '\n\n'>]><a>&e;x</b c>"),
               "<a> 'x' !1/23@3: XML not Well-Formed ERROR");
+}
+
+TEST(CallersParameterEntity, IsKnownToTheSubset) {
+    const std::string text = "<!DOCTYPE a [%p;]><a>&e;</a>";
+    c_read_string source(text);
+    c_error errors;
+    c_xml xml(source, errors, true);
+    xml.add_parameter_entity("p", "<!ENTITY e 'x'>");
+    c_xml_local scope;
+    std::string name;
+    EXPECT_EQ(xml.get_element_name(&scope, &name), EQXP_NAME);
+    EXPECT_TRUE(xml.skip_start_tag(nullptr));
+    EXPECT_TRUE(xml.get_element_value(&name, EQBX_WS_PRESERVE, true));
+    EXPECT_EQ(name, "x");
 }
 
 struct Util {

@@ -2,6 +2,8 @@
 
 #include <gtest/gtest.h>
 
+#include <exception>
+#include <type_traits>
 #include <vector>
 
 #include "runtime/utf8_decoder.h"
@@ -201,6 +203,11 @@ TEST(QbxReaderException, AddsALine) {
     EXPECT_EQ(exception.get_error(), EQBX_UNEXPECTED_END);
     const c_qbx_exception& base = exception;
     EXPECT_STREQ(base.what(), "Unexpected end of message");
+}
+
+TEST(QbxException, DerivesFromNoStandardException) {
+    EXPECT_FALSE((std::is_base_of_v<std::exception, c_qbx_exception>));
+    EXPECT_FALSE((std::is_base_of_v<std::exception, c_qbx_reader_exception>));
 }
 
 TEST(QbxException, TheLibraryIsBuiltWithoutThem) { EXPECT_EQ(QBX_USE_EXCEPTIONS, 0); }

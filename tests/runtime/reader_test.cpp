@@ -73,7 +73,9 @@ INSTANTIATE_TEST_SUITE_P(
                     Token{"another namespace", "<one xmlns='other'/>", EQXP_UNKNOWN_ITEM},
                     Token{"an undeclared prefix", "<q:one/>", EQXP_UNKNOWN_ITEM},
                     Token{"an empty local name", "<V: xmlns:V='doc'/>", EQXP_UNKNOWN_ITEM},
-                    Token{"an element of the instance namespace", "<i:nil " XSI "/>", EQXP_XSI_NIL}));
+                    Token{"an element of the instance namespace", "<i:nil " XSI "/>", EQXP_XSI_NIL},
+                    Token{"the instance namespace as the default one",
+                          "<type xmlns='http://www.w3.org/2001/XMLSchema-instance'/>", EQXP_XSI_TYPE}));
 
 class AttributeToken : public testing::TestWithParam<Token> {};
 
@@ -92,18 +94,20 @@ TEST_P(AttributeToken, IsThatOfTheFirstRowThatMatches) {
 
 INSTANTIATE_TEST_SUITE_P(
     Names, AttributeToken,
-    testing::Values(Token{"without a prefix it has no namespace", "<a one='1'/>", 16},
-                    Token{"under a default namespace too", "<a xmlns='doc' one='1'/>", 16},
-                    Token{"with a prefix it has that namespace", "<a xmlns:V='doc' V:one='1'/>", 14},
-                    Token{"an undeclared prefix", "<a q:one='1'/>", EQXP_UNKNOWN_ITEM},
-                    Token{"xsi:type", "<a " XSI "i:type='1'/>", EQXP_XSI_TYPE},
-                    Token{"xsi:nil", "<a " XSI "i:nil='1'/>", EQXP_XSI_NIL},
-                    Token{"xsi:schemaLocation", "<a " XSI "i:schemaLocation='1'/>", EQXP_XSI_SCHEMA_LOCATION},
-                    Token{"xsi:noNamespaceSchemaLocation", "<a " XSI "i:noNamespaceSchemaLocation='1'/>",
-                          EQXP_XSI_NO_NAMESPACE_SCHEMA_LOCATION},
-                    Token{"xsi:foo", "<a " XSI "i:foo='1'/>", EQXP_UNKNOWN_ITEM},
-                    Token{"xsi: in no other namespace", "<a xmlns:xsi='u' xsi:nil='1'/>",
-                          EQXP_UNKNOWN_ITEM}));
+    testing::Values(
+        Token{"without a prefix it has no namespace", "<a one='1'/>", 16},
+        Token{"under a default namespace too", "<a xmlns='doc' one='1'/>", 16},
+        Token{"with a prefix it has that namespace", "<a xmlns:V='doc' V:one='1'/>", 14},
+        Token{"an undeclared prefix", "<a q:one='1'/>", EQXP_UNKNOWN_ITEM},
+        Token{"the instance namespace is no default for attributes",
+              "<a xmlns='http://www.w3.org/2001/XMLSchema-instance' nil='1'/>", EQXP_UNKNOWN_ITEM},
+        Token{"xsi:type", "<a " XSI "i:type='1'/>", EQXP_XSI_TYPE},
+        Token{"xsi:nil", "<a " XSI "i:nil='1'/>", EQXP_XSI_NIL},
+        Token{"xsi:schemaLocation", "<a " XSI "i:schemaLocation='1'/>", EQXP_XSI_SCHEMA_LOCATION},
+        Token{"xsi:noNamespaceSchemaLocation", "<a " XSI "i:noNamespaceSchemaLocation='1'/>",
+              EQXP_XSI_NO_NAMESPACE_SCHEMA_LOCATION},
+        Token{"xsi:foo", "<a " XSI "i:foo='1'/>", EQXP_UNKNOWN_ITEM},
+        Token{"xsi: in no other namespace", "<a xmlns:xsi='u' xsi:nil='1'/>", EQXP_UNKNOWN_ITEM}));
 
 TEST(Tokenise, AnEmptyTableOrRangeKnowsNothing) {
     Reading r("<one/>");

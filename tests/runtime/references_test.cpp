@@ -148,6 +148,10 @@ TEST(PredefinedEntity, PassesTheModeByAndAPendingSpaceComesOutBehindIt) {
     EXPECT_EQ(value("<a>1 &#65; 2</a>", EQBX_WS_COLLAPSE), "'1 A 2' end") << "a reference to ASCII does not";
 }
 
+TEST(PredefinedEntity, CannotBeRedefined) {
+    EXPECT_EQ(events(with_entities("<!ENTITY lt 'x'>", "<a b='&lt;'>&lt;</a>")), "<a b=[<]> '<' </a> EOF");
+}
+
 TEST(CharacterReference, From128OnPassesTheModeByToo) {
     EXPECT_EQ(value("<a>1 &#233; 2</a>", EQBX_WS_COLLAPSE), "'1\\xC3\\xA9 2' end");
     EXPECT_EQ(value("<a>1&#x2028;2</a>", EQBX_WS_COLLAPSE), "'1 2' end") << "a line end does not";

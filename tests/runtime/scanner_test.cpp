@@ -2,6 +2,7 @@
 
 #include <gtest/gtest.h>
 
+#include "reading_paths.h"
 #include "scan_trace.h"
 
 namespace {
@@ -101,6 +102,10 @@ INSTANTIATE_TEST_SUITE_P(
     testing::Values(
         Document{"a declaration", "<?xml version='1.0'?><a/>", "<a/> EOF"},
         Document{"a comment is no first event", "<!-- c --><?xml version=\"1.0\"?><a/>", "<a/> EOF"},
+        Document{"nor is white space, an instruction, or a declaration",
+                 "\n<?pi?><?xml version='1.0'?><?xml version='1.1'?><a/>", "<a/> EOF"},
+        Document{"an instruction whose target is the beginning of xml goes on to the next ?>",
+                 "<?xm?><a/>?><b/>", "<b/> EOF"},
         Document{"a declaration behind an element is fatal", "<a/><?xml version=\"1.0\"?><b/>",
                  "<a/> !0/13@1: XML declaration not at start of document ERROR"},
         Document{"a declaration behind text is fatal", " x<?xml version=\"1.0\"?><b/>",
@@ -108,6 +113,7 @@ INSTANTIATE_TEST_SUITE_P(
         Document{"every target that begins with xml is a declaration", "<?xml-stylesheet href=\"x\"?><a/>",
                  " !1/13@1: Version not present in XML Decl ERROR"},
         Document{"a document type declaration", "<!DOCTYPE a SYSTEM 'x'><a/>", "<a/> EOF"},
+        Document{"behind comments and instructions", "<!-- --><?pi?><!DOCTYPE a><a/>", "<a/> EOF"},
         Document{"not behind an element", "<a/><!DOCTYPE a>",
                  "<a/> !1/9@1: Document Type Declaration not at start of document ERROR"},
         Document{"nor a second one", "<!DOCTYPE a><!DOCTYPE a><a/>",
@@ -198,6 +204,81 @@ TEST(ScannerNames, AreCutAtTheFirstColon) {
     EXPECT_EQ(c_xml::get_namespace_prefix(name, &name), "p");
     name = "x";
     EXPECT_EQ(c_xml::get_namespace_prefix(name, &name), "");
+}
+
+/// The event that follows a first one, which is an error.
+std::string behind_an_error(const std::string& document) {
+    return reading_paths::on_all_paths(document, [](c_read& source, bool use_runs) {
+        std::string log;
+        reading_paths::RecordingErrors errors(&log);
+        c_xml xml(source, errors, true);
+        xml.use_runs(use_runs);
+        c_xml_local scope;
+        std::string name;
+        EXPECT_EQ(xml.get_element_name(&scope, &name), EQXP_ERROR);
+        const eqxp_xml_event next = xml.get_element_name(&scope, &name);
+        return reading_paths::join({std::to_string(next), " ", name, log});
+    });
+}
+
+TEST(ScannerErrors, ThatAreNotFatalLeaveTheInputBehindTheFault) {
+    EXPECT_EQ(behind_an_error("<1 a='>'><b/>"), "7 b !1/23@1: XML not Well-Formed");
+    EXPECT_EQ(behind_an_error("</a b><c/>"), "5 > !1/23@1: XML not Well-Formed");
+    EXPECT_EQ(behind_an_error("<!ELEMENT a '>'><b/>"), "7 b");
+    EXPECT_EQ(behind_an_error("</><b/>"), "7 b");
+    EXPECT_EQ(behind_an_error(" &u;<b/>"), "7 b");
+}
+
+// Intended: some errors count as the first event of the document, others don't.
+TEST(ScannerErrors, EndTheProlog) {
+    const std::string declaration = "<?xml version='1.0'?><b/>";
+    const std::string too_late = " !0/13@1: XML declaration not at start of document";
+    EXPECT_EQ(behind_an_error("<!x>" + declaration), "3 " + too_late);
+    EXPECT_EQ(behind_an_error("<![CDAT[" + declaration), "3  !1/23@1: XML not Well-Formed" + too_late);
+    EXPECT_EQ(behind_an_error("</>" + declaration), "7 b");
+    EXPECT_EQ(behind_an_error(" &u;" + declaration), "7 b");
+    EXPECT_EQ(behind_an_error("<?xml version='1.0'>" + declaration), "7 b");
+}
+
+// Intended: what stands between tags follows the mode that was set last.
+TEST(ScannerText, FollowsTheModeOfTheValueBefore) {
+    const std::string document = "<a b='1'>x \n y<c/>&#32;z</a>";
+    for (const bool collapsed : {false, true}) {
+        const std::string texts =
+            reading_paths::on_all_paths(document, [collapsed](c_read& source, bool use_runs) {
+                c_error errors;
+                c_xml xml(source, errors, true);
+                xml.use_runs(use_runs);
+                c_xml_local scope;
+                std::string name;
+                xml.get_element_name(&scope, &name);
+                xml.get_attribute_name(&name, false);
+                xml.get_attribute_value(&name, collapsed ? EQBX_WS_COLLAPSE : EQBX_WS_PRESERVE);
+                xml.skip_start_tag(nullptr);
+                EXPECT_EQ(xml.get_element_name(&scope, &name), EQXP_TEXT);
+                std::string all = name;
+                EXPECT_EQ(xml.get_element_name(&scope, &name), EQXP_NAME);
+                xml.skip_start_tag(nullptr);
+                EXPECT_EQ(xml.get_element_name(&scope, &name), EQXP_TEXT);
+                return reading_paths::join({all, "|", name});
+            });
+        EXPECT_EQ(texts, collapsed ? "x y|z" : "x \n y| z");
+    }
+}
+
+TEST(ScannerRewind, LeavesTheAttributesThatWereReadAhead) {
+    const std::string text = "<a b='1' c='2'/>";
+    c_read_string source(text);
+    c_error errors;
+    c_xml xml(source, errors, true);
+    c_xml_local scope;
+    std::string name;
+    xml.get_element_name(&scope, &name);
+    xml.get_attribute_name(&name, false);
+    xml.skip_attribute_value();
+    xml.rewind();
+    EXPECT_EQ(xml.get_attribute_name(&name, false), EQXP_NAME);
+    EXPECT_EQ(name, "c");
 }
 
 TEST(ScannerRewind, ForgetsNamespacesAndEntitiesAndThePhaseOfTheDocument) {

@@ -204,6 +204,33 @@ TEST(DeclaredEncodingMode, HasBecomeSingleByteEvenWhereItIsRefused) {
     EXPECT_EQ(getter.get_encoding(), ENCODING_8BIT);
 }
 
+// Intended: a name is checked against the mode in force, which the name before may have changed.
+TEST(DeclaredEncodingMode, ASecondDeclarationContradictsTheModeThatTheFirstOneSet) {
+    for (const char* const name : {"ISO-8859-1", "US-ASCII", "ISO-10646-UCS-2"}) {
+        const bool wide = name[4] == '1';
+        const std::string bytes = wide ? in_utf16("<a", false) : "<a";
+        std::string log;
+        RecordingErrors errors(&log);
+        c_read_string source(bytes);
+        c_get_as_utf8 getter(source, errors);
+        getter.get();
+        EXPECT_TRUE(getter.set_encoding(name)) << name;
+        EXPECT_FALSE(getter.set_encoding(name)) << name;
+        EXPECT_EQ(log, " !0/15@1: Mis-match between specfied encoding and byte format") << name;
+    }
+}
+
+TEST(DeclaredEncodingMode, BeforeTheFirstByteEveryNameIsAMismatch) {
+    for (const char* const name : {"ISO-10646-UCS-2", "ISO-8859-1", "US-ASCII", "UTF-8", "UTF-16"}) {
+        const std::string bytes = "<a";
+        c_read_string source(bytes);
+        c_error errors;
+        c_get_as_utf8 getter(source, errors);
+        EXPECT_FALSE(getter.set_encoding(name)) << name;
+        EXPECT_EQ(errors.get_last_error(), EQBX_ENCODING_MISMATCH) << name;
+    }
+}
+
 TEST(Utf8DecoderUnget, GivesBackTheLastValueFirst) {
     EXPECT_EQ(on_all_paths("<ab",
                            [](c_read& source, bool use_runs) {
