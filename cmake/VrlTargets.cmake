@@ -26,5 +26,6 @@ function(vrl_add_tests program)
     target_link_libraries(${program} PRIVATE ${ARG_LIBRARIES} GTest::gtest_main vrl::warnings)
     # Built once and run once: what the optimiser would gain in a test, its own work would lose.
     target_compile_options(${program} PRIVATE $<$<CXX_COMPILER_ID:GNU,Clang>:-O0>)
+    target_precompile_headers(${program} REUSE_FROM vrl_test_headers)
     gtest_discover_tests(${program} DISCOVERY_TIMEOUT 60)
 endfunction()
