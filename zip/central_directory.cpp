@@ -4,7 +4,7 @@
 #include "zip/growth.h"
 #include "zip/storage.h"
 
-void CZipCentralDir::Raise(int code) const { CZipException::Raise(code, m_storage->GetFilePath()); }
+void CZipCentralDir::Raise(int code) const { CZipException::Raise(code, m_storage->GetArchivePath()); }
 
 void CZipCentralDir::Init(CZipStorage& storage, CZipCallbacks& callbacks, CZipStringSettings& settings) {
     m_storage = &storage;
@@ -27,11 +27,12 @@ void CZipCentralDir::OpenEntry(std::uint16_t index) {
     m_open = &header;
 }
 
-void CZipCentralDir::CloseEntry(bool checkDescriptor) {
+void CZipCentralDir::CloseEntry(bool checkDescriptor, std::uint32_t unread) {
     CZipFileHeader* header = m_open;
     m_open = nullptr;
     if (!checkDescriptor || (m_ignoredChecks & CZipChecks::descriptor) != 0 || !header->HasDataDescriptor())
         return;
+    if (unread != 0) m_storage->Seek(unread, CZipAbstractFile::current);
     if (!header->CheckDescriptor(*m_storage)) Raise(CZipException::badStructure);
 }
 
@@ -60,7 +61,8 @@ CZipFileHeader& CZipCentralDir::AddNewEntry(const CZipFileHeader& header, std::u
     CZipFileHeader prepared = header;
     prepared.Prepare(level, m_storage->IsSegmented());
     if (IsValidIndex(replaced)) {
-        MakeRoom(replaced, std::uint64_t{prepared.GetLocalRecordSize()} + header.GetCompressedSize() +
+        MakeRoom(replaced, std::uint64_t{prepared.GetLocalRecordSize(*m_storage)} +
+                               header.GetCompressedSize() +
                                CZipEncryption::Overhead(prepared.GetEncryptionMethod()) +
                                prepared.GetDescriptorSize(false));
     } else if (!m_storage->IsSegmented()) {
@@ -76,8 +78,8 @@ CZipFileHeader& CZipCentralDir::AddCopiedEntry(const CZipFileHeader& header, std
     CZipFileHeader prepared = header;
     prepared.PrepareCopy(m_storage->IsSegmented());
     if (IsValidIndex(replaced)) {
-        MakeRoom(replaced, std::uint64_t{prepared.GetLocalRecordSize()} + header.GetCompressedSize() +
-                               prepared.GetDescriptorSize(false));
+        MakeRoom(replaced, std::uint64_t{prepared.GetLocalRecordSize(*m_storage)} +
+                               header.GetCompressedSize() + prepared.GetDescriptorSize(false));
     } else if (!m_storage->IsSegmented()) {
         m_storage->SeekToEnd();
     }

@@ -84,8 +84,9 @@ public:
     CZipFileHeader* GetOpenHeader() { return m_open; }
     /// Checks the local header of an entry and goes to its data. 101.
     void OpenEntry(std::uint16_t index);
-    /// With `checkDescriptor` compares the data descriptor, if there is one and the check is on. 101.
-    void CloseEntry(bool checkDescriptor);
+    /// With `checkDescriptor` compares the data descriptor, if there is one and the check is on; it stands
+    /// behind as many bytes as have been left `unread`. 101.
+    void CloseEntry(bool checkDescriptor, std::uint32_t unread = 0);
 
     /// Takes in a new entry and writes its local header. With an index for `replaced`, the place of that
     /// entry becomes as large as the new one's preset sizes tell.
@@ -107,14 +108,16 @@ public:
     std::uint16_t FindEntry(const std::string& name, bool caseSensitive);
     /// Takes an entry out of the array; with `shift` the indexes above it fall by one.
     void RemoveFromFindArray(std::uint16_t index, bool shift);
-    std::size_t GetFindCount() const { return m_findArray.size(); }
-
-private:
+    /// An entry of the array for finding: a header, and its index among all.
     struct FindRecord {
         CZipFileHeader* header;
         std::uint16_t index;
     };
+    std::size_t GetFindCount() const { return m_findArray.size(); }
+    /// In the order of the decoded names.
+    const FindRecord& GetFindRecord(std::size_t place) const { return m_findArray[place]; }
 
+private:
     [[noreturn]] void Raise(int code) const;
     void ReadEndRecord();
     void RefuseZip64() const;

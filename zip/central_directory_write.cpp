@@ -1,5 +1,6 @@
 #include <algorithm>
 #include <array>
+#include <cerrno>
 
 #include "zip/bytes.h"
 #include "zip/central_directory.h"
@@ -12,20 +13,20 @@ using ZipArchiveLib::StoreNumber32;
 
 std::uint64_t CZipCentralDir::GetDirectorySize() {
     std::uint64_t size = 0;
-    for (const auto& header : m_headers) size += header->GetCentralRecordSize();
+    for (const auto& header : m_headers) size += header->GetCentralRecordSize(*m_storage);
     return size;
 }
 
 void CZipCentralDir::Write() {
     if (m_info->existsOnDisk) return;
+    if (m_info->comment.GetSize() >= k_fieldLimit) Raise(CZipException::fieldTooLong);
     m_info->totalEntries = GetCount();
     bool madeSingle = false;
     if (m_storage->IsSegmented()) {
         const std::uint64_t needed = GetDirectorySize() + k_endSize + m_info->comment.GetSize();
+        if (needed > ZipArchiveLib::k_largestNumber) Raise(EFBIG);
         madeSingle = m_storage->GetCurrentVolume() == 0 && TryMakeSingleVolume(needed);
-        if (!madeSingle)
-            m_storage->AssureFree(
-                static_cast<std::uint32_t>(std::min(needed, ZipArchiveLib::k_largestNumber)));
+        if (!madeSingle) m_storage->AssureFree(static_cast<std::uint32_t>(needed));
     } else {
         m_storage->SeekToEnd();
     }
@@ -75,7 +76,7 @@ void CZipCentralDir::WriteHeaders() {
     m_info->directorySize = 0;
     m_info->entriesOnThisDisk = 0;
     for (const auto& header : m_headers) {
-        const std::uint32_t size = header->GetCentralRecordSize();
+        const std::uint32_t size = header->GetCentralRecordSize(*m_storage);
         header->WriteCentral(*m_storage);
         m_info->directorySize += size;
         ++m_info->entriesOnThisDisk;

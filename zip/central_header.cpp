@@ -68,20 +68,20 @@ void CZipFileHeader::AddCentralRecords() {
     WriteNamesRecord();
 }
 
-std::uint32_t CZipFileHeader::GetCentralRecordSize() {
+std::uint32_t CZipFileHeader::GetCentralRecordSize(const CZipStorage& storage) {
     StoreName();
     AddCentralRecords();
     const std::uint64_t extraSize = m_centralExtra.GetTotalSize();
     DropCentralRecords();
     if (m_comment.GetSize() >= k_fieldLimit || m_storedName.GetSize() >= k_fieldLimit ||
         extraSize >= k_fieldLimit)
-        CZipException::Raise(CZipException::fieldTooLong);
+        CZipException::Raise(CZipException::fieldTooLong, storage.GetArchivePath());
     return k_centralSize + m_storedName.GetSize() + static_cast<std::uint32_t>(extraSize) +
            m_comment.GetSize();
 }
 
 void CZipFileHeader::WriteCentral(CZipStorage& storage) {
-    CZipAutoBuffer record(GetCentralRecordSize());
+    CZipAutoBuffer record(GetCentralRecordSize(storage));
     AddCentralRecords();
     std::uint8_t* out = record.GetBuffer();
     std::copy(std::begin(k_centralSignature), std::end(k_centralSignature), out);

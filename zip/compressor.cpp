@@ -34,7 +34,7 @@ void CZipCompressor::BeginDecompression(CZipFileHeader& header, CZipCryptograph*
     PrepareBuffer();
     m_header = &header;
     m_cryptograph = cryptograph;
-    m_compressedLeft = header.GetDataSize();
+    m_compressedLeft = header.GetDataSize(m_storage.GetFilePath());
     m_uncompressedLeft = header.GetUncompressedSize();
     m_crc = 0;
 }

@@ -48,9 +48,9 @@ CZipFileHeader& CZipFileHeader::operator=(const CZipFileHeader& other) {
 
 bool CZipFileHeader::HasDataDescriptor() const { return (m_flags & k_descriptorFlag) != 0; }
 
-std::uint32_t CZipFileHeader::GetDataSize() const {
+std::uint32_t CZipFileHeader::GetDataSize(const std::string& archivePath) const {
     const std::uint32_t overhead = CZipEncryption::Overhead(m_encryptionMethod);
-    if (m_compressedSize < overhead) CZipException::Raise(CZipException::badStructure);
+    if (m_compressedSize < overhead) CZipException::Raise(CZipException::badStructure, archivePath);
     return m_compressedSize - overhead;
 }
 

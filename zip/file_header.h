@@ -77,9 +77,9 @@ public:
     bool IsEncrypted() const { return m_encryptionMethod != CZipEncryption::none; }
     bool IsAes() const { return CZipEncryption::IsAes(m_encryptionMethod); }
     bool HasDataDescriptor() const;
-    /// The compressed data alone, without what encryption adds. CZipException 101 when there is less than
-    /// that.
-    std::uint32_t GetDataSize() const;
+    /// The compressed data alone, without what encryption adds. CZipException 101, with this path, when there
+    /// is less than that.
+    std::uint32_t GetDataSize(const std::string& archivePath = {}) const;
     /// The CRC as it stands in records: 0 under AE-2.
     std::uint32_t GetStoredCrc() const { return m_aesVersion2 ? 0 : m_crc; }
 
@@ -135,8 +135,9 @@ public:
     /// 110 when the name, the comment or the extra field is too long.
     void WriteCentral(CZipStorage& storage);
 
-    std::uint32_t GetLocalRecordSize();
-    std::uint32_t GetCentralRecordSize();
+    /// As written to this storage. 110 as above, from both.
+    std::uint32_t GetLocalRecordSize(const CZipStorage& storage);
+    std::uint32_t GetCentralRecordSize(const CZipStorage& storage);
     std::uint32_t GetDescriptorSize(bool segmented) const;
 
 private:

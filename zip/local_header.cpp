@@ -118,13 +118,13 @@ void CZipFileHeader::PrepareCopy(bool segmented) {
         static_cast<std::uint16_t>(segmented ? m_flags | k_descriptorFlag : m_flags & ~k_descriptorFlag);
 }
 
-std::uint32_t CZipFileHeader::GetLocalRecordSize() {
+std::uint32_t CZipFileHeader::GetLocalRecordSize(const CZipStorage& storage) {
     StoreName();
     CZipExtraField extra = m_localExtra;
     WriteAesRecord(extra);
     const std::uint64_t extraSize = extra.GetTotalSize();
     if (m_storedName.GetSize() >= k_fieldLimit || extraSize >= k_fieldLimit)
-        CZipException::Raise(CZipException::fieldTooLong);
+        CZipException::Raise(CZipException::fieldTooLong, storage.GetArchivePath());
     return k_localSize + m_storedName.GetSize() + static_cast<std::uint32_t>(extraSize);
 }
 
@@ -135,7 +135,7 @@ void CZipFileHeader::WriteLocal(CZipStorage& storage) {
     } else {
         m_localCompressedSize += CZipEncryption::HeaderSize(m_encryptionMethod);
     }
-    CZipAutoBuffer record(GetLocalRecordSize());
+    CZipAutoBuffer record(GetLocalRecordSize(storage));
     const std::uint32_t nameSize = m_storedName.GetSize();
     CZipExtraField extra = m_localExtra;
     WriteAesRecord(extra);
@@ -147,7 +147,7 @@ void CZipFileHeader::WriteLocal(CZipStorage& storage) {
     StoreNumber16(out + 8, GetWireMethod());
     StoreNumber16(out + 10, m_modificationTime);
     StoreNumber16(out + 12, m_modificationDate);
-    StoreNumber32(out + k_localCrcAt, HasDataDescriptor() ? 0 : GetStoredCrc());
+    StoreNumber32(out + k_localCrcAt, GetStoredCrc());
     StoreNumber32(out + k_localCrcAt + 4, m_localCompressedSize);
     StoreNumber32(out + k_localCrcAt + 8, m_localUncompressedSize);
     StoreNumber16(out + 26, static_cast<std::uint16_t>(nameSize));

@@ -91,7 +91,7 @@ void CZipStorage::OpenByMode(int mode, int volumeSize) {
 }
 
 void CZipStorage::Open(CZipAbstractFile& file, int mode) {
-    Reset({});
+    Reset(file.GetFilePath());
     m_file = &file;
     m_stream = true;
     switch (mode) {
@@ -165,7 +165,7 @@ std::string CZipStorage::Close(bool afterException) {
 std::uint32_t CZipStorage::Read(void* buffer, std::uint32_t size, bool atOnce) {
     if (size == 0) return 0;
     std::uint32_t got = m_file->Read(buffer, size);
-    while (got == 0) {
+    if (got == 0) {
         if (!IsSegmented()) Raise(CZipException::badStructure);
         NextVolumeForReading();
         got = m_file->Read(buffer, size);

@@ -53,8 +53,7 @@ int CZipArchive::CloseEntry(const char* targetPath, bool afterException) {
         m_compressor->EndDecompression(false);
         if (targetPath != nullptr && !DressTarget(targetPath, header)) result = -2;
         if (m_cryptograph) m_cryptograph->EndDecode(header, m_storage);
-        if (unread != 0) m_storage.Seek(unread, CZipAbstractFile::current);
-        m_directory.CloseEntry(true);
+        m_directory.CloseEntry(true, unread);
     }
     m_state = idle;
     m_cryptograph.reset();

@@ -190,6 +190,15 @@ TEST_F(DirectoryReading, ExhaustivelyTheyAreReadToTheEndRecord) {
     archive.Close(1);
 }
 
+TEST_F(DirectoryReading, ExhaustivelyNoMoreEntriesAreTakenThanIndexesCanTell) {
+    RawArchive raw;
+    raw.entries.assign(65537, RawEntry::Stored("n", "x"));
+    raw.total = raw.entriesHere = 2;
+    archive.SetExhaustiveRead(true);
+    ASSERT_EQ(Open(raw.Build()), 0);
+    EXPECT_EQ(archive.GetCount(), 65535);
+}
+
 struct BadDirectory {
     const char* why;
     std::function<void(RawArchive&)> spoil;
@@ -469,6 +478,36 @@ TEST_F(DirectoryWriting, AnOverlongFieldRaises110OnClose) {
     EXPECT_TRUE(archive.IsClosed());
 }
 
+TEST_F(DirectoryWriting, AnOverlongCommentOfTheArchiveRaises110) {
+    archive.Open(file, CZipStorage::create);
+    archive.GetCentralDir().GetInfo().comment.Allocate(65536, true);
+    EXPECT_EQ(CodeOf([&] { archive.Close(); }), 110);
+    archive.GetCentralDir().GetInfo().comment.Allocate(65535, true);
+    archive.Close();
+    EXPECT_EQ(file.GetLength(), 22U + 65535);
+}
+
+TEST_F(DirectoryWriting, AnOverlongFieldNamesTheArchive) {
+    const ScratchFolder folder;
+    const std::string path = folder / "a.zip";
+    archive.Open(path.c_str(), CZipStorage::create);
+    Add("a", "first");
+    archive.GetEntryHeader(0)->SetComment(std::string(65536, 'c'));
+    CZipFileHeader overlong;
+    overlong.SetFileName(std::string(65536, 'n'));
+    for (const auto& action : {std::function<void()>([&] { archive.OpenNewEntry(overlong, 0); }),
+                               std::function<void()>([&] { archive.Close(); })}) {
+        try {
+            action();
+            ADD_FAILURE();
+        } catch (const CZipException& exception) {
+            EXPECT_EQ(exception.GetCode(), 110);
+            EXPECT_EQ(exception.GetPath(), path);
+        }
+    }
+    archive.Close(1);
+}
+
 TEST(DirectoryInformation, CanBeShared) {
     CZipStorage storage(CZipEnvironment::System());
     CZipCallbacks callbacks;
@@ -543,8 +582,19 @@ TEST_F(Finding, TheArrayIsBuiltOnDemandAndKeptInOrderByInsertion) {
 TEST_F(Finding, RemovalRewritesTheIndexesAboveWhenAskedTo) {
     CZipCentralDir& directory = archive.GetCentralDir();
     directory.EnableFindFast(true, true);
+    const auto indexes = [&] {
+        std::vector<int> all;
+        for (std::size_t i = 0; i < directory.GetFindCount(); ++i)
+            all.push_back(directory.GetFindRecord(i).index);
+        return all;
+    };
+    // By their names: Alpha, GAMMA, alpha, delta, dir\beta.
+    EXPECT_EQ(indexes(), (std::vector<int>{1, 3, 4, 0, 2}));
+    EXPECT_EQ(directory.GetFindRecord(0).header, &directory.GetHeader(1));
     directory.RemoveFromFindArray(1, false);
-    EXPECT_EQ(directory.GetFindCount(), 4U);
+    EXPECT_EQ(indexes(), (std::vector<int>{3, 4, 0, 2}));
+    directory.RemoveFromFindArray(3, true);
+    EXPECT_EQ(indexes(), (std::vector<int>{3, 0, 2}));
     directory.EnableFindFast(true, true);
     directory.RemoveLastEntry();
     EXPECT_EQ(directory.GetFindCount(), 4U);
@@ -552,10 +602,21 @@ TEST_F(Finding, RemovalRewritesTheIndexesAboveWhenAskedTo) {
     EXPECT_EQ(directory.FindEntry("GAMMA", true), 3);
 }
 
-TEST_F(Finding, AnArrayOfAnExistingArchiveIsBuiltOnReading) {
+TEST_F(Finding, TheArrayIsBuiltOnReadingWhereItIsEnabled) {
     archive.Close();
-    archive.Open(file, CZipStorage::openReadOnly);
-    EXPECT_EQ(archive.FindEntry("DIR\\beta"), 2);
+    for (const bool enabled : {false, true}) {
+        CZipStorage storage(CZipEnvironment::System());
+        CZipCallbacks callbacks;
+        CZipStringSettings settings;
+        CZipCentralDir directory;
+        storage.Open(file, CZipStorage::openReadOnly);
+        directory.Init(storage, callbacks, settings);
+        directory.GetInfo().findFastEnabled = enabled;
+        directory.Read(false);
+        EXPECT_EQ(directory.GetFindCount(), enabled ? 5U : 0U);
+        EXPECT_EQ(directory.FindEntry("DIR\\beta", false), 2);
+        storage.Close(true);
+    }
 }
 
 TEST(NameComparison, WithoutCaseFoldsAsciiLettersAlone) {

@@ -209,7 +209,7 @@ TEST_F(FileHeader, CentralRecordHasThePublishedLayout) {
                              Number32(0x11223344) + Number32(5) + Number32(6) + Number16(9) + Number16(5) +
                              Number16(4) + Number16(0) + Number16(0) + Number32(0x81B40020) + Number32(77) +
                              "dir/a.txt" + zip_test::ExtraRecord(0x1234, Bytes(1, '\0')) + "note");
-    EXPECT_EQ(header.GetCentralRecordSize(), file.GetLength());
+    EXPECT_EQ(header.GetCentralRecordSize(storage), file.GetLength());
 }
 
 TEST_F(FileHeader, DecodingFreesTheStoredNameAndWritingTheDecodedOne) {

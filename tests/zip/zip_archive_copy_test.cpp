@@ -91,6 +91,15 @@ TEST_F(Copying, FromVolumesGivesAPlainEntry) {
     EXPECT_EQ(Contents(archive, 0), zip_test::ReadData("document.txt"));
 }
 
+TEST_F(Copying, WritesTheKnownCrcIntoALocalHeaderBesideADescriptor) {
+    OpenSource(zip_test::ReadData("traditional.zip"));
+    archive.Open((folder / "a.zip").c_str(), CZipStorage::create);
+    ASSERT_TRUE(archive.CopyEntryFrom(source, 0));
+    archive.Close();
+    EXPECT_EQ(folder.Read("a.zip").substr(14, 12),
+              zip_test::Number32(source.GetEntryHeader(0)->GetCrc()) + Bytes(8, '\0'));
+}
+
 TEST_F(Copying, KeepsTheSystemOrTakesThisArchives) {
     RawEntry entry = RawEntry::Stored("a", "text");
     entry.madeBy = 0x0314;
@@ -436,6 +445,13 @@ TEST_F(OnOneVolume, AFailureInTheAttemptEndsTheSegmentsAndIsTold) {
     EXPECT_EQ(world.files.OpenCount(), 0U);
 }
 
+TEST_F(OnOneVolume, AutoFlushWaitsForTheEndOfTheVolumes) {
+    archive.SetAutoFlush(true);
+    Write(1000);
+    Reopen();
+    ExpectAll();
+}
+
 TEST_F(OnOneVolume, AnEmptySplitArchiveIsAnEndRecord) {
     archive.Open((folder / "a.zip").c_str(), CZipStorage::createSegmented, 1000);
     archive.Close();
@@ -524,6 +540,32 @@ TEST_F(Copying, ASpannedArchiveIsWrittenAndReadDiskByDisk) {
     spanned.GetCentralDir().SetIgnoredChecks(0);
     EXPECT_TRUE(Contents(spanned, 0) == noise);
     spanned.Close();
+}
+
+// A disk on which others write, too: when the descriptors have gone, the room for the directory has as well.
+TEST_F(OnOneVolume, AVolumeThatFillsUpDuringTheAttemptRaises101) {
+    class EmptyDisks : public Disks {
+    public:
+        EmptyDisks(const ScratchFolder& place, World& around) : Disks(place), m_world(around) {}
+        bool RequestVolume(Request& request) override {
+            m_world.volumes.space = 100000;
+            return Disks::RequestVolume(request);
+        }
+
+    private:
+        World& m_world;
+    };
+    EmptyDisks disks(folder, world);
+    world.volumes.removable = true;
+    archive.SetVolumeCallbacks(&disks, nullptr);
+    archive.GetStorage().SetBufferSizes(100, 100);
+    archive.Open((folder / "a.zip").c_str(), CZipStorage::createSegmented, CZipStorage::k_spannedVolumeSize);
+    ASSERT_TRUE(archive.AddFile(folder.Write("text", text).c_str()));
+    world.volumes.space = 0;
+    EXPECT_EQ(CodeOf([&] { archive.Close(); }), 101);
+    EXPECT_EQ(disks.Inserted(), 2);
+    archive.Close(1);
+    EXPECT_EQ(world.files.OpenCount(), 0U);
 }
 
 }  // namespace

@@ -211,6 +211,16 @@ TEST_F(Archive, AnEntryLeftInTheMiddleGivesMinus1) {
     EXPECT_EQ(archive.CloseEntry(), -1);
 }
 
+TEST_F(Archive, AnEntryThatIsNotReadGivesMinus1HoweverLongItClaimsToBe) {
+    RawEntry entry = RawEntry::Stored("a", "text");
+    entry.compressed = entry.uncompressed = 0xF0000000;
+    Bytes bytes = RawArchive::Of({entry}).Build();
+    CZipMemFile file(bytes.data(), static_cast<std::uint32_t>(bytes.size()), 0);
+    archive.Open(file, CZipStorage::openReadOnly);
+    ASSERT_TRUE(archive.OpenEntry(0));
+    EXPECT_EQ(archive.CloseEntry(), -1);
+}
+
 TEST_F(Archive, AnotherCrcRaises102UnlessTheCheckIsOff) {
     RawEntry entry = RawEntry::DeflatedEntry("a", "some text");
     ++entry.crc;
@@ -390,6 +400,12 @@ TEST_F(Archive, AnEncipheredEntryTooSmallForItsHeadersRaises101) {
         code = CodeOf([&] { archive.OpenEntry(0); });
     }
     EXPECT_EQ(code, 101);
+    try {
+        archive.OpenEntry(0);
+        FAIL();
+    } catch (const CZipException& exception) {
+        EXPECT_EQ(exception.GetPath(), folder / "a.zip");
+    }
 }
 
 TEST_F(Archive, PasswordsAreTakenAsTheyAreAndClearedByEveryOpen) {
@@ -408,6 +424,13 @@ TEST_F(Archive, PasswordsAreTakenAsTheyAreAndClearedByEveryOpen) {
     archive.Close();
     OpenText("text");
     EXPECT_EQ(archive.GetPassword().GetSize(), 0U);
+}
+
+TEST_F(Archive, TheRootPathIsClearedByEveryOpen) {
+    archive.SetRootPath("/some/root/");
+    EXPECT_EQ(archive.GetRootPath(), "/some/root");
+    OpenText("text");
+    EXPECT_EQ(archive.GetRootPath(), "");
 }
 
 TEST_F(Archive, EncryptionMethodsAreThoseThatThereAre) {
