@@ -142,7 +142,9 @@ bool CDeflateCompressor::FillInput() {
 }
 
 void CDeflateCompressor::TakeStored() {
-    while (FillInput() && m_stream.avail_out != 0) {
+    // Once even with no room, so that a cryptograph sees what stands behind the declared size.
+    do {
+        if (!FillInput()) return;
         const uInt size = std::min(m_stream.avail_in, m_stream.avail_out);
         const std::uint8_t* from = m_stream.next_out;
         std::memcpy(m_stream.next_out, m_stream.next_in, size);
@@ -151,7 +153,7 @@ void CDeflateCompressor::TakeStored() {
         m_stream.next_out += size;
         m_stream.avail_out -= size;
         CountDelivered(from);
-    }
+    } while (m_stream.avail_out != 0);
 }
 
 void CDeflateCompressor::CountDelivered(const std::uint8_t* from) {

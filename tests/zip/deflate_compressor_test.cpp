@@ -119,6 +119,19 @@ TEST_F(Deflate, AStoredEntryWithTooManyBytesGivesThoseDeclared) {
     EXPECT_EQ(Read(1), "");
 }
 
+TEST_F(Deflate, AStoredEntryIsReadNoFurtherThanAskedFor) {
+    CDeflateCompressor::COptions options;
+    options.bufferSize = 4;
+    compressor.ApplyOptions(options);
+    Begin("abcd", 4, CZipFileHeader::stored);
+    header.SetCompressedSize(8);
+    header.SetUncompressedSize(8);
+    compressor.BeginDecompression(header, nullptr);
+    EXPECT_EQ(Read(4), "abcd") << "what is missing behind it is the next read's matter";
+    EXPECT_EQ(CodeOf([&] { Read(1); }), 101);
+    compressor.EndDecompression(true);
+}
+
 // The compressed bytes end ahead of the stream. Whatever stands behind them in the file is not read, nothing
 // made up is delivered, and the entry is short.
 TEST_F(Deflate, AStreamCutAtAnyByteIsShortAndNeverReadPastItsEntry) {
