@@ -13,7 +13,8 @@ constexpr int k_strongestLevel = 9;
 bool CZipArchive::CanBeginEntry(std::uint16_t replacedIndex) const {
     if (IsClosed() || m_state != idle || m_storage.IsReadOnly()) return false;
     if (m_storage.IsSegmented() && !m_storage.IsNewSegmented()) return false;
-    if (replacedIndex == k_noIndex) return GetCount() != CZipCentralDir::k_mostEntries;
+    if (GetCount() == CZipCentralDir::k_mostEntries) return false;
+    if (replacedIndex == k_noIndex) return true;
     return m_directory.IsValidIndex(replacedIndex) && !m_storage.IsSegmented();
 }
 

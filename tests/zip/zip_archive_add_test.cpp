@@ -100,6 +100,7 @@ TEST_F(Adding, AnArchiveTakes65535Entries) {
     EXPECT_TRUE(Add(path));
     EXPECT_FALSE(Add(path));
     EXPECT_FALSE(archive.OpenNewEntry(CZipFileHeader(), -1));
+    EXPECT_FALSE(archive.OpenNewEntry(CZipFileHeader(), 0, nullptr, 3)) << "not even in another's place";
     Reopen();
     EXPECT_EQ(archive.GetCount(), 65535);
     EXPECT_EQ(Contents(65534), "text");
