@@ -526,6 +526,28 @@ TEST_P(DamagedPackedRoute, EndsAsTold) {
 INSTANTIATE_TEST_SUITE_P(Rows, DamagedPackedRoute, testing::ValuesIn(k_damages),
                          [](const auto& row) { return std::string(row.param.name); });
 
+TEST_F(PackedRoute, ReadsTheDocumentOrNothingWhateverBitIsFlippedAndWhereverItIsCut) {
+    const Bytes whole = RawArchive::Of({deflated()}).Build();
+    const std::size_t open = zip_test::OpenDescriptors();
+    for (std::size_t bit = 0; bit < 8 * whole.size(); ++bit) {
+        Bytes bytes = whole;
+        bytes[bit / 8] = static_cast<char>(bytes[bit / 8] ^ (1 << (bit % 8)));
+        folder.Write("a", bytes);
+        Vrl document;
+        const outcome loaded = load(document, L"a.vrlz");
+        EXPECT_TRUE(loaded.result == 0 || loaded.result == k_failed || loaded.thrown > 0) << bit;
+        ASSERT_EQ(document.size_Color(), loaded.result == 0 ? 1u : 0u) << bit;
+        if (loaded.result == 0) {
+            EXPECT_EQ(document.get_Color(0).get_ColorName(), L"packed") << bit;
+        }
+    }
+    for (std::size_t size = 0; size < whole.size(); ++size) {
+        folder.Write("a", whole.substr(0, size));
+        EXPECT_EQ(load(L"a.vrlz").thrown, 101) << size;
+    }
+    EXPECT_EQ(zip_test::OpenDescriptors(), open);
+}
+
 TEST_F(PackedRoute, LetsTheExceptionForAnythingElseThanAnArchiveLeave) {
     for (const Bytes& bytes : {Bytes(), Bytes("PK\3\4"), k_text, Bytes(100000, 'P')}) {
         folder.Write("a", bytes);
