@@ -26,7 +26,7 @@ protected:
 /// The root element with another preamble than its own, child by child as the root writes them itself.
 eqbx_error marshal_document(const Vrl& document, const Preamble& preamble, std::ostream& os) {
     qbxV2::c_xml_writer out(os, qbxV2::c_xml_writer::include_xml_decl, "\t", "\n");
-    const frame::open_element gathering(out);
+    frame::open_element gathering(out);
     frame::open_start_tag(out, k_root, {.declares_namespaces = true});
     frame::end_start_tag_of_children(out);
     frame::children_writer children(out);
@@ -38,6 +38,7 @@ eqbx_error marshal_document(const Vrl& document, const Preamble& preamble, std::
     for (unsigned i = 0; i < document.size_ColorQualityControl() && os; ++i)
         children.object(document.get_ColorQualityControl(i), "Vrl:ColorQualityControl");
     if (children.result() == qbxV2::EQBX_NO_ERROR) frame::write_end_tag_of_children(out, k_root);
+    gathering.close();
     return children.result();
 }
 

@@ -16,6 +16,18 @@ constexpr std::size_t k_gathered_at_once = 32 * 1024;
 // Namespaces in XML: XML Schema Part 1, 2.6.
 constexpr const char k_schema_instance_uri[] = "http://www.w3.org/2001/XMLSchema-instance";
 
+/// Empties a text at the end of a scope, whichever way it ends.
+class emptied_text {
+public:
+    explicit emptied_text(std::string& text) : m_text(text) {}
+    emptied_text(const emptied_text&) = delete;
+    emptied_text& operator=(const emptied_text&) = delete;
+    ~emptied_text() { m_text.clear(); }
+
+private:
+    std::string& m_text;
+};
+
 }  // namespace
 
 c_xml_writer::c_xml_writer(std::ostream& os, int flags, const char* tab, const char* nl)
@@ -169,9 +181,16 @@ void c_xml_writer::open_element() {
 }
 
 void c_xml_writer::close_element() {
-    if (--m_open_elements == 0) {
-        put_through();
-        m_gathering = false;
+    if (--m_open_elements != 0) return;
+    m_gathering = false;
+    put_through();
+}
+
+void c_xml_writer::abandon_element() noexcept {
+    try {
+        close_element();
+    } catch (...) {
+        // The exception that is on its way says what went wrong first.
     }
 }
 
@@ -206,8 +225,9 @@ void c_xml_writer::put_line_end() {
 
 void c_xml_writer::put_through() {
     if (!m_pending.empty()) {
+        // Gone even where the stream throws: nothing is handed over twice.
+        const emptied_text after(m_pending);
         m_os.write(m_pending.data(), static_cast<std::streamsize>(m_pending.size()));
-        m_pending.clear();
     }
     if (m_zero_fill) {
         m_os.fill('0');

@@ -92,6 +92,8 @@ public:
     /// wait in the writer's buffer; `operator()` and every virtual call find them in the stream.
     void open_element();
     void close_element();
+    /// Instead of `close_element` while an exception is on its way: the stream's own stays back.
+    void abandon_element() noexcept;
     void put(const char* text, std::size_t length);
     void put(const char* text);
     /// As `operator()(true)`.

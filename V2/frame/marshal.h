@@ -28,19 +28,26 @@ public:
     explicit open_element(qbxV2::c_xml_writer& out) : m_out(out) { out.open_element(); }
     open_element(const open_element&) = delete;
     open_element& operator=(const open_element&) = delete;
-    ~open_element() { m_out.close_element(); }
+    ~open_element() {
+        if (m_open) m_out.abandon_element();
+    }
+
+    /// Hands over what waits. The stream may throw here, as it may in every write; a destructor must not.
+    void close() {
+        m_open = false;
+        m_out.close_element();
+    }
 
 private:
     qbxV2::c_xml_writer& m_out;
+    bool m_open = true;
 };
 
-/// Writes `self` as an element called `name`. On a failure of a child, the start tag stays open and the
-/// indentation raised: nothing is written behind an error.
+/// Writes what stands between the cardinality test and the end. On a failure of a child, the start tag stays
+/// open and the indentation raised: nothing is written behind an error.
 template <class T>
-qbxV2::eqbx_error marshal(const T& self, qbxV2::c_xml_writer& out, const char* name,
-                          const written_kind& kind) {
-    if (!self.T::is_occurs_ok()) return qbxV2::EQBX_OCCURS_ERROR_ON_MARSHAL;
-    const open_element gathering(out);
+qbxV2::eqbx_error marshal_complete(const T& self, qbxV2::c_xml_writer& out, const char* name,
+                                   const written_kind& kind) {
     open_start_tag(out, name, kind);
     access::marshal_attributes(self, out);
     if (access::is_nil(&self, 0)) {
@@ -58,6 +65,17 @@ qbxV2::eqbx_error marshal(const T& self, qbxV2::c_xml_writer& out, const char* n
     if (failed != qbxV2::EQBX_NO_ERROR) return failed;
     write_end_tag_of_children(out, name);
     return qbxV2::EQBX_NO_ERROR;
+}
+
+/// Writes `self` as an element called `name`.
+template <class T>
+qbxV2::eqbx_error marshal(const T& self, qbxV2::c_xml_writer& out, const char* name,
+                          const written_kind& kind) {
+    if (!self.T::is_occurs_ok()) return qbxV2::EQBX_OCCURS_ERROR_ON_MARSHAL;
+    open_element gathering(out);
+    const qbxV2::eqbx_error result = marshal_complete(self, out, name, kind);
+    gathering.close();
+    return result;
 }
 
 }  // namespace vrl_v2::frame

@@ -312,4 +312,52 @@ TEST(Writer, LeavesTheShapeThatACallerGaveTheStream) {
     EXPECT_TRUE(os.flags() & std::ios_base::hex);
 }
 
+/// Takes so many bytes and no more.
+class small_buffer : public std::stringbuf {
+public:
+    explicit small_buffer(std::size_t room) : m_room(room) {}
+
+protected:
+    std::streamsize xsputn(const char* text, std::streamsize length) override {
+        const std::size_t taken = std::min(static_cast<std::size_t>(length), m_room);
+        m_room -= taken;
+        return std::stringbuf::xsputn(text, static_cast<std::streamsize>(taken));
+    }
+
+private:
+    std::size_t m_room;
+};
+
+TEST(Writer, HandsTheStreamsExceptionToTheCaller) {
+    Vrl document;
+    complete(document);
+    for (unsigned i = 0; i < 100; ++i) complete(document.get_Color(i));
+    std::string whole;
+    ASSERT_EQ(document.marshal(&whole), 0);
+    ASSERT_GT(whole.size(), 50000u) << "more than the writer keeps";
+    for (const std::size_t room : {std::size_t(0), k_declaration.size(), k_declaration.size() + 1,
+                                   std::size_t(40000), whole.size() - 1}) {
+        small_buffer buffer(room);
+        std::ostream os(&buffer);
+        os.exceptions(std::ios_base::badbit | std::ios_base::failbit);
+        EXPECT_THROW(document.marshal(os), std::ios_base::failure) << room;
+        EXPECT_EQ(buffer.str(), whole.substr(0, room)) << "as far as it goes, and nothing twice";
+    }
+    small_buffer buffer(whole.size());
+    std::ostream os(&buffer);
+    os.exceptions(std::ios_base::badbit | std::ios_base::failbit);
+    EXPECT_EQ(document.marshal(os), 0);
+    EXPECT_EQ(buffer.str(), whole);
+}
+
+// Intended: a stream that fails in silence goes unnoticed.
+TEST(Writer, DoesNotLookAtTheStateOfTheStream) {
+    Vrl document;
+    complete(document);
+    small_buffer buffer(100);
+    std::ostream os(&buffer);
+    EXPECT_EQ(document.marshal(os), 0);
+    EXPECT_FALSE(os);
+}
+
 }  // namespace

@@ -442,4 +442,51 @@ TEST(WriterGathering, IsLeftToASubclassToRefuse) {
     EXPECT_EQ(os.str(), ".x|");
 }
 
+/// Fails once, then takes everything.
+class failing_once : public std::stringbuf {
+protected:
+    std::streamsize xsputn(const char* text, std::streamsize length) override {
+        return std::exchange(m_fails, false) ? 0 : std::stringbuf::xsputn(text, length);
+    }
+
+private:
+    bool m_fails = true;
+};
+
+TEST(WriterGathering, HandsNothingOverTwiceToAStreamThatThrows) {
+    failing_once buffer;
+    std::ostream os(&buffer);
+    os.exceptions(std::ios_base::badbit);
+    c_xml_writer out(os, "\t", "\n");
+    out.open_element();
+    out.put("a");
+    EXPECT_THROW(out.close_element(), std::ios_base::failure);
+    EXPECT_FALSE(out.is_gathering());
+    os.clear();
+    out.open_element();
+    out.put("b");
+    out.close_element();
+    EXPECT_EQ(buffer.str(), "b");
+}
+
+TEST(WriterGathering, IsAbandonedWithoutASecondException) {
+    failing_once buffer;
+    std::ostream os(&buffer);
+    os.exceptions(std::ios_base::badbit);
+    c_xml_writer out(os, "\t", "\n");
+    out.open_element();
+    out.open_element();
+    out.put("a");
+    out.abandon_element();
+    EXPECT_TRUE(out.is_gathering()) << "the outer one is open";
+    out.abandon_element();
+    EXPECT_FALSE(out.is_gathering());
+    EXPECT_EQ(buffer.str(), "");
+    os.clear();
+    out.open_element();
+    out.put("b");
+    out.abandon_element();
+    EXPECT_EQ(buffer.str(), "b") << "what waits goes out where it can";
+}
+
 }  // namespace
