@@ -67,7 +67,12 @@ void declare_nil(printer& out, const class_plan& made) {
 }
 
 void declare_steps(printer& out, const class_plan& made) {
-    out.print("\nprotected:\n    friend struct frame::access;\n");
+    out.print(R"(
+protected:
+    friend struct frame::access;
+    void make_room_for($C$ const& other);
+    void exchange($C$& other) noexcept;
+)");
     if (made.has_own_attribute_reading()) {
         out.print(
             R"(    bool unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name, qbxV2::eqbx_error* error);

@@ -54,7 +54,7 @@ std::string occurs_expression(const class_plan& made) {
         if (!test.empty()) tests.push_back(test);
     }
     if (tests.empty()) tests.push_back("true");
-    const std::string all = join(tests, " && ");
+    std::string all = join(tests, " && ");
     if (!made.nillable) return all;
     return tests.size() == 1 ? "m_nil || " + all : std::string("m_nil || (").append(all).append(")");
 }
@@ -89,12 +89,35 @@ $C$::~$C$() = default;
 )");
 }
 
+/// Objects are exchanged by their contents, so both sides need them; everything else moves as it stands.
+bool is_exchanged_by_contents(const member_plan& member) {
+    return member.kind == member_kind::object || member.kind == member_kind::group;
+}
+
+void define_making_room(printer& out, const class_plan& made) {
+    std::string steps;
+    const auto step = [&steps](const std::string& call, const std::string& argument) {
+        steps.append("    ").append(call).append("make_room_for(").append(argument).append(");\n");
+    };
+    if (!made.base.empty()) step(made.base + "::", "other");
+    for (const member_plan& member : made.members) {
+        if (is_exchanged_by_contents(member)) step("m_" + member.name + ".", "other.m_" + member.name);
+    }
+    out.print(steps.empty() ? "void $C$::make_room_for($C$ const&) {}\n"
+                            : "void $C$::make_room_for($C$ const& other) {\n$steps$}\n",
+              {{"steps", steps}});
+}
+
 void define_swap(printer& out, const class_plan& made) {
-    out.print("\nvoid $C$::swap([[maybe_unused]] $C$& other) {\n");
-    if (!made.base.empty()) out.print("    $base$::swap(other);\n");
+    out.print("\nvoid $C$::swap($C$& other) { frame::swap_whole(*this, other); }\n");
+    define_making_room(out, made);
+    out.print("void $C$::exchange([[maybe_unused]] $C$& other) noexcept {\n");
+    if (!made.base.empty()) out.print("    $base$::exchange(other);\n");
     if (made.kind == class_kind::choice) out.print("    std::swap(m_chosen, other.m_chosen);\n");
     for (const member_plan& member : made.members) {
-        out.print("    m_$X$.swap(other.m_$X$);\n", {{"X", member.name}});
+        out.print(is_exchanged_by_contents(member) ? "    m_$X$.exchange(other.m_$X$);\n"
+                                                   : "    m_$X$.swap(other.m_$X$);\n",
+                  {{"X", member.name}});
     }
     if (made.nillable) out.print("    std::swap(m_nil, other.m_nil);\n");
     out.print("}\n");

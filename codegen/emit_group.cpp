@@ -43,6 +43,8 @@ void declare_group(printer& out, const class_plan& made) {
     out.print(R"(
 protected:
     friend struct frame::access;
+    void make_room_for($C$ const& other);
+    void exchange($C$& other) noexcept;
     qbxV2::eqbx_error marshal_child_elements(qbxV2::c_xml_writer& out) const;
 
 private:
@@ -90,7 +92,10 @@ $C$& $C$::operator=($C$ const& other) {
     return *this;
 }
 $C$::~$C$() = default;
-void $C$::swap($C$& other) { m_held.swap(other.m_held); }
+void $C$::swap($C$& other) { frame::swap_whole(*this, other); }
+// What is held moves as it stands.
+void $C$::make_room_for($C$ const&) {}
+void $C$::exchange($C$& other) noexcept { m_held.swap(other.m_held); }
 void $C$::reset() { frame::reset_by_swap(*this); }
 bool $C$::is_occurs_ok() const { return !m_held.is_none(); }
 qbxV2::eqbx_error $C$::marshal(qbxV2::c_xml_writer& out, char const*) const {

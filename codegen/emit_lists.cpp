@@ -88,7 +88,7 @@ void $C$::get_any(unsigned i, std::string* ns, std::string* name, std::string* v
 }
 qbxV2::eqbx_error $C$::append_any(std::string const& value) { return insert_any(m_any.size(), value); }
 qbxV2::eqbx_error $C$::insert_any(unsigned i, std::string const& value) {
-    m_any.insert(i).set_value(value);
+    m_any.insert(i, qbxV2::c_any_info("", "", value));
     return qbxV2::EQBX_NO_ERROR;
 }
 void $C$::delete_any(unsigned i) { m_any.erase(i); }

@@ -2,6 +2,7 @@
 
 #include <string>
 
+#include "V2/frame/storage.h"
 #include "runtime/xml_reader.h"
 #include "runtime/xml_writer.h"
 
@@ -33,6 +34,15 @@ struct access {
     }
 
     template <class T>
+    static void make_room(T& mine, const T& other) {
+        mine.T::make_room_for(other);
+    }
+    template <class T>
+    static void exchange(T& mine, T& other) noexcept {
+        mine.T::exchange(other);
+    }
+
+    template <class T>
     static void marshal_attributes(const T& self, qbxV2::c_xml_writer& out) {
         self.T::marshal_attributes(out);
     }
@@ -55,5 +65,15 @@ private:
         return self->T::unmarshal_body(reader, name, error);
     }
 };
+
+template <class T>
+void make_room(T& mine, const T& other) {
+    access::make_room(mine, other);
+}
+
+template <class T>
+void exchange(T& mine, T& other) noexcept {
+    access::exchange(mine, other);
+}
 
 }  // namespace vrl_v2::frame

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "V2/frame/access.h"
 #include "V2/frame/limits.h"
 #include "V2/frame/storage.h"
 
@@ -54,6 +55,14 @@ void copy_optional(child<T>& member, const child<T>& source) {
 template <class T>
 bool has_chosen(const child<T>& member) {
     return member.is_set() && member.get().is_occurs_ok();
+}
+
+/// Whole or not at all: whatever has to be allocated for it is there before the first member moves.
+template <class T>
+void swap_whole(T& a, T& b) {
+    make_room(a, b);
+    make_room(b, a);
+    exchange(a, b);
 }
 
 template <class T>

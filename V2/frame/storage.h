@@ -9,6 +9,15 @@
 /// nothing is shared between two objects.
 namespace vrl_v2::frame {
 
+// The two steps of swapping objects of a class; access.h has what they do.
+
+/// Lets `mine` have storage for every object that `other` has, all the way down.
+template <class T>
+void make_room(T& mine, const T& other);
+/// Exchanges two objects that have room for each other.
+template <class T>
+void exchange(T& mine, T& other) noexcept;
+
 /// What a const getter answers where nothing has been stored yet: one default object a type, for ever.
 template <class T>
 const T& absent() {
@@ -49,8 +58,9 @@ public:
 
     /// Asking for a mutable reference makes the member present.
     T& get() {
+        T& object = storage();
         m_set = true;
-        return storage();
+        return object;
     }
 
     /// The object without a change of presence.
@@ -61,15 +71,17 @@ public:
 
     T& assign(const T& value) {
         T copy(value);
-        T& mine = get();
-        mine.swap(copy);
-        return mine;
+        storage().swap(copy);
+        return get();
     }
 
+    void make_room_for(const child& other) {
+        if (other.m_object != nullptr) make_room(storage(), *other.m_object);
+    }
     /// Exchanges contents, so that a reference to either object stays with its owner.
-    void swap(child& other) {
+    void exchange(child& other) noexcept {
         if (this == &other) return;
-        if (m_object != nullptr || other.m_object != nullptr) storage().swap(other.storage());
+        if (m_object != nullptr) frame::exchange(*m_object, *other.m_object);
         std::swap(m_set, other.m_set);
     }
 

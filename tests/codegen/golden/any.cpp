@@ -39,7 +39,9 @@ Box& Box::operator=(Box const& other) {
 }
 Box::~Box() = default;
 
-void Box::swap([[maybe_unused]] Box& other) {
+void Box::swap(Box& other) { frame::swap_whole(*this, other); }
+void Box::make_room_for(Box const&) {}
+void Box::exchange([[maybe_unused]] Box& other) noexcept {
     m_any.swap(other.m_any);
 }
 void Box::reset() { frame::reset_by_swap(*this); }
@@ -62,7 +64,7 @@ void Box::get_any(unsigned i, std::string* ns, std::string* name, std::string* v
 }
 qbxV2::eqbx_error Box::append_any(std::string const& value) { return insert_any(m_any.size(), value); }
 qbxV2::eqbx_error Box::insert_any(unsigned i, std::string const& value) {
-    m_any.insert(i).set_value(value);
+    m_any.insert(i, qbxV2::c_any_info("", "", value));
     return qbxV2::EQBX_NO_ERROR;
 }
 void Box::delete_any(unsigned i) { m_any.erase(i); }
@@ -98,8 +100,12 @@ Attic& Attic::operator=(Attic const& other) {
 }
 Attic::~Attic() = default;
 
-void Attic::swap([[maybe_unused]] Attic& other) {
-    m_Box.swap(other.m_Box);
+void Attic::swap(Attic& other) { frame::swap_whole(*this, other); }
+void Attic::make_room_for(Attic const& other) {
+    m_Box.make_room_for(other.m_Box);
+}
+void Attic::exchange([[maybe_unused]] Attic& other) noexcept {
+    m_Box.exchange(other.m_Box);
 }
 void Attic::reset() { frame::reset_by_swap(*this); }
 bool Attic::is_occurs_ok() const { return true; }

@@ -39,6 +39,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(Box const& other);
+    void exchange(Box& other) noexcept;
     bool unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name, qbxV2::eqbx_error* error);
     qbxV2::eqbx_error unmarshal_attributes_check(qbxV2::c_xml_reader& reader);
     void marshal_attributes(qbxV2::c_xml_writer& out) const;
@@ -71,6 +73,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(Attic const& other);
+    void exchange(Attic& other) noexcept;
     bool unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name, qbxV2::eqbx_error* error);
     qbxV2::eqbx_error unmarshal_attributes_check(qbxV2::c_xml_reader& reader);
     void marshal_attributes(qbxV2::c_xml_writer& out) const;

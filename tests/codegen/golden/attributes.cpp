@@ -53,7 +53,9 @@ Ruler& Ruler::operator=(Ruler const& other) {
 }
 Ruler::~Ruler() = default;
 
-void Ruler::swap([[maybe_unused]] Ruler& other) {
+void Ruler::swap(Ruler& other) { frame::swap_whole(*this, other); }
+void Ruler::make_room_for(Ruler const&) {}
+void Ruler::exchange([[maybe_unused]] Ruler& other) noexcept {
     m_Unit.swap(other.m_Unit);
     m_Length.swap(other.m_Length);
     m_Step.swap(other.m_Step);
@@ -130,8 +132,12 @@ FoldingRuler& FoldingRuler::operator=(FoldingRuler const& other) {
 }
 FoldingRuler::~FoldingRuler() = default;
 
-void FoldingRuler::swap([[maybe_unused]] FoldingRuler& other) {
-    Ruler::swap(other);
+void FoldingRuler::swap(FoldingRuler& other) { frame::swap_whole(*this, other); }
+void FoldingRuler::make_room_for(FoldingRuler const& other) {
+    Ruler::make_room_for(other);
+}
+void FoldingRuler::exchange([[maybe_unused]] FoldingRuler& other) noexcept {
+    Ruler::exchange(other);
     m_Links.swap(other.m_Links);
 }
 void FoldingRuler::reset() { frame::reset_by_swap(*this); }
@@ -187,8 +193,12 @@ PaintedRuler& PaintedRuler::operator=(PaintedRuler const& other) {
 }
 PaintedRuler::~PaintedRuler() = default;
 
-void PaintedRuler::swap([[maybe_unused]] PaintedRuler& other) {
-    Ruler::swap(other);
+void PaintedRuler::swap(PaintedRuler& other) { frame::swap_whole(*this, other); }
+void PaintedRuler::make_room_for(PaintedRuler const& other) {
+    Ruler::make_room_for(other);
+}
+void PaintedRuler::exchange([[maybe_unused]] PaintedRuler& other) noexcept {
+    Ruler::exchange(other);
     m_Paint.swap(other.m_Paint);
 }
 void PaintedRuler::reset() { frame::reset_by_swap(*this); }

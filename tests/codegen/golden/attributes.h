@@ -44,6 +44,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(Ruler const& other);
+    void exchange(Ruler& other) noexcept;
     bool unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name, qbxV2::eqbx_error* error);
     qbxV2::eqbx_error unmarshal_attributes_check(qbxV2::c_xml_reader& reader);
     void marshal_attributes(qbxV2::c_xml_writer& out) const;
@@ -76,6 +78,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(FoldingRuler const& other);
+    void exchange(FoldingRuler& other) noexcept;
     bool unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name, qbxV2::eqbx_error* error);
     qbxV2::eqbx_error unmarshal_attributes_check(qbxV2::c_xml_reader& reader);
     void marshal_attributes(qbxV2::c_xml_writer& out) const;
@@ -105,6 +109,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(PaintedRuler const& other);
+    void exchange(PaintedRuler& other) noexcept;
     bool unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name, qbxV2::eqbx_error* error);
     qbxV2::eqbx_error unmarshal_attributes_check(qbxV2::c_xml_reader& reader);
     void marshal_attributes(qbxV2::c_xml_writer& out) const;

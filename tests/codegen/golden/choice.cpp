@@ -55,7 +55,9 @@ Coin& Coin::operator=(Coin const& other) {
 }
 Coin::~Coin() = default;
 
-void Coin::swap([[maybe_unused]] Coin& other) {
+void Coin::swap(Coin& other) { frame::swap_whole(*this, other); }
+void Coin::make_room_for(Coin const&) {}
+void Coin::exchange([[maybe_unused]] Coin& other) noexcept {
     m_Face.swap(other.m_Face);
 }
 void Coin::reset() { frame::reset_by_swap(*this); }
@@ -108,7 +110,9 @@ Payment& Payment::operator=(Payment const& other) {
 }
 Payment::~Payment() = default;
 
-void Payment::swap([[maybe_unused]] Payment& other) {
+void Payment::swap(Payment& other) { frame::swap_whole(*this, other); }
+void Payment::make_room_for(Payment const&) {}
+void Payment::exchange([[maybe_unused]] Payment& other) noexcept {
     std::swap(m_chosen, other.m_chosen);
     m_Payer.swap(other.m_Payer);
     m_Amount.swap(other.m_Amount);
@@ -245,8 +249,12 @@ Sale& Sale::operator=(Sale const& other) {
 }
 Sale::~Sale() = default;
 
-void Sale::swap([[maybe_unused]] Sale& other) {
-    m_Payment.swap(other.m_Payment);
+void Sale::swap(Sale& other) { frame::swap_whole(*this, other); }
+void Sale::make_room_for(Sale const& other) {
+    m_Payment.make_room_for(other.m_Payment);
+}
+void Sale::exchange([[maybe_unused]] Sale& other) noexcept {
+    m_Payment.exchange(other.m_Payment);
 }
 void Sale::reset() { frame::reset_by_swap(*this); }
 bool Sale::is_occurs_ok() const { return frame::has_chosen(m_Payment); }

@@ -33,6 +33,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(Coin const& other);
+    void exchange(Coin& other) noexcept;
     bool unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name, qbxV2::eqbx_error* error);
     qbxV2::eqbx_error unmarshal_attributes_check(qbxV2::c_xml_reader& reader);
     void marshal_attributes(qbxV2::c_xml_writer& out) const;
@@ -83,6 +85,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(Payment const& other);
+    void exchange(Payment& other) noexcept;
     bool unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name, qbxV2::eqbx_error* error);
     qbxV2::eqbx_error unmarshal_attributes_check(qbxV2::c_xml_reader& reader);
     void marshal_attributes(qbxV2::c_xml_writer& out) const;
@@ -120,6 +124,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(Sale const& other);
+    void exchange(Sale& other) noexcept;
     bool unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name, qbxV2::eqbx_error* error);
     qbxV2::eqbx_error unmarshal_attributes_check(qbxV2::c_xml_reader& reader);
     void marshal_attributes(qbxV2::c_xml_writer& out) const;

@@ -42,7 +42,9 @@ Vrl& Vrl::operator=(Vrl const& other) {
 }
 Vrl::~Vrl() = default;
 
-void Vrl::swap([[maybe_unused]] Vrl& other) {
+void Vrl::swap(Vrl& other) { frame::swap_whole(*this, other); }
+void Vrl::make_room_for(Vrl const&) {}
+void Vrl::exchange([[maybe_unused]] Vrl& other) noexcept {
     m_Title.swap(other.m_Title);
 }
 void Vrl::reset() { frame::reset_by_swap(*this); }

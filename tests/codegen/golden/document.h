@@ -58,6 +58,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(Vrl const& other);
+    void exchange(Vrl& other) noexcept;
     bool unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name, qbxV2::eqbx_error* error);
     qbxV2::eqbx_error unmarshal_attributes_check(qbxV2::c_xml_reader& reader);
     void marshal_attributes(qbxV2::c_xml_writer& out) const;

@@ -54,7 +54,9 @@ Shirt& Shirt::operator=(Shirt const& other) {
 }
 Shirt::~Shirt() = default;
 
-void Shirt::swap([[maybe_unused]] Shirt& other) {
+void Shirt::swap(Shirt& other) { frame::swap_whole(*this, other); }
+void Shirt::make_room_for(Shirt const&) {}
+void Shirt::exchange([[maybe_unused]] Shirt& other) noexcept {
     m_Size.swap(other.m_Size);
     m_Fabric.swap(other.m_Fabric);
 }
@@ -138,7 +140,9 @@ Sleeve& Sleeve::operator=(Sleeve const& other) {
 }
 Sleeve::~Sleeve() = default;
 
-void Sleeve::swap([[maybe_unused]] Sleeve& other) {
+void Sleeve::swap(Sleeve& other) { frame::swap_whole(*this, other); }
+void Sleeve::make_room_for(Sleeve const&) {}
+void Sleeve::exchange([[maybe_unused]] Sleeve& other) noexcept {
     m_Sleeve.swap(other.m_Sleeve);
 }
 void Sleeve::reset() { frame::reset_by_swap(*this); }
@@ -196,7 +200,9 @@ Measure& Measure::operator=(Measure const& other) {
 }
 Measure::~Measure() = default;
 
-void Measure::swap([[maybe_unused]] Measure& other) {
+void Measure::swap(Measure& other) { frame::swap_whole(*this, other); }
+void Measure::make_room_for(Measure const&) {}
+void Measure::exchange([[maybe_unused]] Measure& other) noexcept {
     std::swap(m_chosen, other.m_chosen);
     m_Size.swap(other.m_Size);
     m_Girth.swap(other.m_Girth);

@@ -54,6 +54,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(Shirt const& other);
+    void exchange(Shirt& other) noexcept;
     bool unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name, qbxV2::eqbx_error* error);
     qbxV2::eqbx_error unmarshal_attributes_check(qbxV2::c_xml_reader& reader);
     void marshal_attributes(qbxV2::c_xml_writer& out) const;
@@ -94,6 +96,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(Sleeve const& other);
+    void exchange(Sleeve& other) noexcept;
     bool unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name, qbxV2::eqbx_error* error);
     qbxV2::eqbx_error unmarshal_attributes_check(qbxV2::c_xml_reader& reader);
     void marshal_attributes(qbxV2::c_xml_writer& out) const;
@@ -144,6 +148,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(Measure const& other);
+    void exchange(Measure& other) noexcept;
     bool unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name, qbxV2::eqbx_error* error);
     qbxV2::eqbx_error unmarshal_attributes_check(qbxV2::c_xml_reader& reader);
     void marshal_attributes(qbxV2::c_xml_writer& out) const;

@@ -52,7 +52,9 @@ ShapeType& ShapeType::operator=(ShapeType const& other) {
 }
 ShapeType::~ShapeType() = default;
 
-void ShapeType::swap([[maybe_unused]] ShapeType& other) {
+void ShapeType::swap(ShapeType& other) { frame::swap_whole(*this, other); }
+void ShapeType::make_room_for(ShapeType const&) {}
+void ShapeType::exchange([[maybe_unused]] ShapeType& other) noexcept {
     m_Area.swap(other.m_Area);
 }
 void ShapeType::reset() { frame::reset_by_swap(*this); }
@@ -125,8 +127,12 @@ Plate& Plate::operator=(Plate const& other) {
 }
 Plate::~Plate() = default;
 
-void Plate::swap([[maybe_unused]] Plate& other) {
-    m_Shape.swap(other.m_Shape);
+void Plate::swap(Plate& other) { frame::swap_whole(*this, other); }
+void Plate::make_room_for(Plate const& other) {
+    m_Shape.make_room_for(other.m_Shape);
+}
+void Plate::exchange([[maybe_unused]] Plate& other) noexcept {
+    m_Shape.exchange(other.m_Shape);
     m_Hole.swap(other.m_Hole);
     m_Thickness.swap(other.m_Thickness);
 }
@@ -207,9 +213,13 @@ Cover& Cover::operator=(Cover const& other) {
 }
 Cover::~Cover() = default;
 
-void Cover::swap([[maybe_unused]] Cover& other) {
+void Cover::swap(Cover& other) { frame::swap_whole(*this, other); }
+void Cover::make_room_for(Cover const& other) {
+    m_Hole.make_room_for(other.m_Hole);
+}
+void Cover::exchange([[maybe_unused]] Cover& other) noexcept {
     m_Shape.swap(other.m_Shape);
-    m_Hole.swap(other.m_Hole);
+    m_Hole.exchange(other.m_Hole);
 }
 void Cover::reset() { frame::reset_by_swap(*this); }
 bool Cover::is_occurs_ok() const { return !m_Shape.empty(); }
@@ -296,7 +306,10 @@ sg_Shape& sg_Shape::operator=(sg_Shape const& other) {
     return *this;
 }
 sg_Shape::~sg_Shape() = default;
-void sg_Shape::swap(sg_Shape& other) { m_held.swap(other.m_held); }
+void sg_Shape::swap(sg_Shape& other) { frame::swap_whole(*this, other); }
+// What is held moves as it stands.
+void sg_Shape::make_room_for(sg_Shape const&) {}
+void sg_Shape::exchange(sg_Shape& other) noexcept { m_held.swap(other.m_held); }
 void sg_Shape::reset() { frame::reset_by_swap(*this); }
 bool sg_Shape::is_occurs_ok() const { return !m_held.is_none(); }
 qbxV2::eqbx_error sg_Shape::marshal(qbxV2::c_xml_writer& out, char const*) const {
@@ -349,7 +362,10 @@ sg_Hole& sg_Hole::operator=(sg_Hole const& other) {
     return *this;
 }
 sg_Hole::~sg_Hole() = default;
-void sg_Hole::swap(sg_Hole& other) { m_held.swap(other.m_held); }
+void sg_Hole::swap(sg_Hole& other) { frame::swap_whole(*this, other); }
+// What is held moves as it stands.
+void sg_Hole::make_room_for(sg_Hole const&) {}
+void sg_Hole::exchange(sg_Hole& other) noexcept { m_held.swap(other.m_held); }
 void sg_Hole::reset() { frame::reset_by_swap(*this); }
 bool sg_Hole::is_occurs_ok() const { return !m_held.is_none(); }
 qbxV2::eqbx_error sg_Hole::marshal(qbxV2::c_xml_writer& out, char const*) const {
@@ -381,8 +397,12 @@ CircleType& CircleType::operator=(CircleType const& other) {
 }
 CircleType::~CircleType() = default;
 
-void CircleType::swap([[maybe_unused]] CircleType& other) {
-    ShapeType::swap(other);
+void CircleType::swap(CircleType& other) { frame::swap_whole(*this, other); }
+void CircleType::make_room_for(CircleType const& other) {
+    ShapeType::make_room_for(other);
+}
+void CircleType::exchange([[maybe_unused]] CircleType& other) noexcept {
+    ShapeType::exchange(other);
 }
 void CircleType::reset() { frame::reset_by_swap(*this); }
 bool CircleType::is_occurs_ok() const { return ShapeType::is_occurs_ok(); }
@@ -415,8 +435,12 @@ SquareType& SquareType::operator=(SquareType const& other) {
 }
 SquareType::~SquareType() = default;
 
-void SquareType::swap([[maybe_unused]] SquareType& other) {
-    ShapeType::swap(other);
+void SquareType::swap(SquareType& other) { frame::swap_whole(*this, other); }
+void SquareType::make_room_for(SquareType const& other) {
+    ShapeType::make_room_for(other);
+}
+void SquareType::exchange([[maybe_unused]] SquareType& other) noexcept {
+    ShapeType::exchange(other);
 }
 void SquareType::reset() { frame::reset_by_swap(*this); }
 bool SquareType::is_occurs_ok() const { return ShapeType::is_occurs_ok(); }

@@ -44,6 +44,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(ShapeType const& other);
+    void exchange(ShapeType& other) noexcept;
     bool unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name, qbxV2::eqbx_error* error);
     qbxV2::eqbx_error unmarshal_attributes_check(qbxV2::c_xml_reader& reader);
     void marshal_attributes(qbxV2::c_xml_writer& out) const;
@@ -90,6 +92,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(Plate const& other);
+    void exchange(Plate& other) noexcept;
     bool unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name, qbxV2::eqbx_error* error);
     qbxV2::eqbx_error unmarshal_attributes_check(qbxV2::c_xml_reader& reader);
     void marshal_attributes(qbxV2::c_xml_writer& out) const;
@@ -135,6 +139,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(Cover const& other);
+    void exchange(Cover& other) noexcept;
     bool unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name, qbxV2::eqbx_error* error);
     qbxV2::eqbx_error unmarshal_attributes_check(qbxV2::c_xml_reader& reader);
     void marshal_attributes(qbxV2::c_xml_writer& out) const;
@@ -185,6 +191,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(sg_Shape const& other);
+    void exchange(sg_Shape& other) noexcept;
     qbxV2::eqbx_error marshal_child_elements(qbxV2::c_xml_writer& out) const;
 
 private:
@@ -222,6 +230,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(sg_Hole const& other);
+    void exchange(sg_Hole& other) noexcept;
     qbxV2::eqbx_error marshal_child_elements(qbxV2::c_xml_writer& out) const;
 
 private:
@@ -250,6 +260,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(CircleType const& other);
+    void exchange(CircleType& other) noexcept;
 
 private:
 };
@@ -276,6 +288,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(SquareType const& other);
+    void exchange(SquareType& other) noexcept;
 
 private:
 };

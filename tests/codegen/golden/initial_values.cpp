@@ -53,7 +53,9 @@ Lamp& Lamp::operator=(Lamp const& other) {
 }
 Lamp::~Lamp() = default;
 
-void Lamp::swap([[maybe_unused]] Lamp& other) {
+void Lamp::swap(Lamp& other) { frame::swap_whole(*this, other); }
+void Lamp::make_room_for(Lamp const&) {}
+void Lamp::exchange([[maybe_unused]] Lamp& other) noexcept {
     m_Color.swap(other.m_Color);
     m_Power.swap(other.m_Power);
     m_Sockets.swap(other.m_Sockets);

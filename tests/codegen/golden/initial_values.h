@@ -63,6 +63,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(Lamp const& other);
+    void exchange(Lamp& other) noexcept;
     bool unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name, qbxV2::eqbx_error* error);
     qbxV2::eqbx_error unmarshal_attributes_check(qbxV2::c_xml_reader& reader);
     void marshal_attributes(qbxV2::c_xml_writer& out) const;

@@ -48,7 +48,9 @@ Stop& Stop::operator=(Stop const& other) {
 }
 Stop::~Stop() = default;
 
-void Stop::swap([[maybe_unused]] Stop& other) {
+void Stop::swap(Stop& other) { frame::swap_whole(*this, other); }
+void Stop::make_room_for(Stop const&) {}
+void Stop::exchange([[maybe_unused]] Stop& other) noexcept {
     m_Place.swap(other.m_Place);
 }
 void Stop::reset() { frame::reset_by_swap(*this); }
@@ -101,7 +103,9 @@ Journey& Journey::operator=(Journey const& other) {
 }
 Journey::~Journey() = default;
 
-void Journey::swap([[maybe_unused]] Journey& other) {
+void Journey::swap(Journey& other) { frame::swap_whole(*this, other); }
+void Journey::make_room_for(Journey const&) {}
+void Journey::exchange([[maybe_unused]] Journey& other) noexcept {
     m_Fare.swap(other.m_Fare);
     m_Remark.swap(other.m_Remark);
     m_Stop.swap(other.m_Stop);

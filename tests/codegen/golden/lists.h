@@ -33,6 +33,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(Stop const& other);
+    void exchange(Stop& other) noexcept;
     bool unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name, qbxV2::eqbx_error* error);
     qbxV2::eqbx_error unmarshal_attributes_check(qbxV2::c_xml_reader& reader);
     void marshal_attributes(qbxV2::c_xml_writer& out) const;
@@ -95,6 +97,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(Journey const& other);
+    void exchange(Journey& other) noexcept;
     bool unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name, qbxV2::eqbx_error* error);
     qbxV2::eqbx_error unmarshal_attributes_check(qbxV2::c_xml_reader& reader);
     void marshal_attributes(qbxV2::c_xml_writer& out) const;

@@ -71,7 +71,9 @@ CatType& CatType::operator=(CatType const& other) {
 }
 CatType::~CatType() = default;
 
-void CatType::swap([[maybe_unused]] CatType& other) {
+void CatType::swap(CatType& other) { frame::swap_whole(*this, other); }
+void CatType::make_room_for(CatType const&) {}
+void CatType::exchange([[maybe_unused]] CatType& other) noexcept {
     m_Name.swap(other.m_Name);
 }
 void CatType::reset() { frame::reset_by_swap(*this); }
@@ -122,7 +124,9 @@ CallType& CallType::operator=(CallType const& other) {
 }
 CallType::~CallType() = default;
 
-void CallType::swap([[maybe_unused]] CallType& other) {
+void CallType::swap(CallType& other) { frame::swap_whole(*this, other); }
+void CallType::make_room_for(CallType const&) {}
+void CallType::exchange([[maybe_unused]] CallType& other) noexcept {
     m_Pitch.swap(other.m_Pitch);
     m_CallType.swap(other.m_CallType);
 }
@@ -192,7 +196,9 @@ Mouse& Mouse::operator=(Mouse const& other) {
 }
 Mouse::~Mouse() = default;
 
-void Mouse::swap([[maybe_unused]] Mouse& other) {
+void Mouse::swap(Mouse& other) { frame::swap_whole(*this, other); }
+void Mouse::make_room_for(Mouse const&) {}
+void Mouse::exchange([[maybe_unused]] Mouse& other) noexcept {
     m_Hole.swap(other.m_Hole);
     m_Cheese.swap(other.m_Cheese);
     std::swap(m_nil, other.m_nil);
@@ -256,7 +262,9 @@ Sign& Sign::operator=(Sign const& other) {
 }
 Sign::~Sign() = default;
 
-void Sign::swap([[maybe_unused]] Sign& other) {
+void Sign::swap(Sign& other) { frame::swap_whole(*this, other); }
+void Sign::make_room_for(Sign const&) {}
+void Sign::exchange([[maybe_unused]] Sign& other) noexcept {
     m_Sign.swap(other.m_Sign);
     std::swap(m_nil, other.m_nil);
 }
@@ -318,11 +326,18 @@ House& House::operator=(House const& other) {
 }
 House::~House() = default;
 
-void House::swap([[maybe_unused]] House& other) {
-    m_Cat.swap(other.m_Cat);
-    m_Call.swap(other.m_Call);
-    m_Mouse.swap(other.m_Mouse);
-    m_Sign.swap(other.m_Sign);
+void House::swap(House& other) { frame::swap_whole(*this, other); }
+void House::make_room_for(House const& other) {
+    m_Cat.make_room_for(other.m_Cat);
+    m_Call.make_room_for(other.m_Call);
+    m_Mouse.make_room_for(other.m_Mouse);
+    m_Sign.make_room_for(other.m_Sign);
+}
+void House::exchange([[maybe_unused]] House& other) noexcept {
+    m_Cat.exchange(other.m_Cat);
+    m_Call.exchange(other.m_Call);
+    m_Mouse.exchange(other.m_Mouse);
+    m_Sign.exchange(other.m_Sign);
 }
 void House::reset() { frame::reset_by_swap(*this); }
 bool House::is_occurs_ok() const {
@@ -392,8 +407,12 @@ Stray& Stray::operator=(Stray const& other) {
 }
 Stray::~Stray() = default;
 
-void Stray::swap([[maybe_unused]] Stray& other) {
-    CatType::swap(other);
+void Stray::swap(Stray& other) { frame::swap_whole(*this, other); }
+void Stray::make_room_for(Stray const& other) {
+    CatType::make_room_for(other);
+}
+void Stray::exchange([[maybe_unused]] Stray& other) noexcept {
+    CatType::exchange(other);
     std::swap(m_nil, other.m_nil);
 }
 void Stray::reset() { frame::reset_by_swap(*this); }
@@ -461,8 +480,12 @@ Call& Call::operator=(Call const& other) {
 }
 Call::~Call() = default;
 
-void Call::swap([[maybe_unused]] Call& other) {
-    CallType::swap(other);
+void Call::swap(Call& other) { frame::swap_whole(*this, other); }
+void Call::make_room_for(Call const& other) {
+    CallType::make_room_for(other);
+}
+void Call::exchange([[maybe_unused]] Call& other) noexcept {
+    CallType::exchange(other);
     std::swap(m_nil, other.m_nil);
 }
 void Call::reset() { frame::reset_by_swap(*this); }
@@ -504,8 +527,12 @@ Cat& Cat::operator=(Cat const& other) {
 }
 Cat::~Cat() = default;
 
-void Cat::swap([[maybe_unused]] Cat& other) {
-    CatType::swap(other);
+void Cat::swap(Cat& other) { frame::swap_whole(*this, other); }
+void Cat::make_room_for(Cat const& other) {
+    CatType::make_room_for(other);
+}
+void Cat::exchange([[maybe_unused]] Cat& other) noexcept {
+    CatType::exchange(other);
     std::swap(m_nil, other.m_nil);
 }
 void Cat::reset() { frame::reset_by_swap(*this); }

@@ -33,6 +33,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(CatType const& other);
+    void exchange(CatType& other) noexcept;
     bool unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name, qbxV2::eqbx_error* error);
     qbxV2::eqbx_error unmarshal_attributes_check(qbxV2::c_xml_reader& reader);
     void marshal_attributes(qbxV2::c_xml_writer& out) const;
@@ -65,6 +67,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(CallType const& other);
+    void exchange(CallType& other) noexcept;
     bool unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name, qbxV2::eqbx_error* error);
     qbxV2::eqbx_error unmarshal_attributes_check(qbxV2::c_xml_reader& reader);
     void marshal_attributes(qbxV2::c_xml_writer& out) const;
@@ -103,6 +107,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(Mouse const& other);
+    void exchange(Mouse& other) noexcept;
     bool unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name, qbxV2::eqbx_error* error);
     qbxV2::eqbx_error unmarshal_attributes_check(qbxV2::c_xml_reader& reader);
     void marshal_attributes(qbxV2::c_xml_writer& out) const;
@@ -138,6 +144,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(Sign const& other);
+    void exchange(Sign& other) noexcept;
     bool unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name, qbxV2::eqbx_error* error);
     qbxV2::eqbx_error unmarshal_attributes_check(qbxV2::c_xml_reader& reader);
     void marshal_attributes(qbxV2::c_xml_writer& out) const;
@@ -182,6 +190,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(House const& other);
+    void exchange(House& other) noexcept;
     bool unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name, qbxV2::eqbx_error* error);
     qbxV2::eqbx_error unmarshal_attributes_check(qbxV2::c_xml_reader& reader);
     void marshal_attributes(qbxV2::c_xml_writer& out) const;
@@ -229,6 +239,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(Stray const& other);
+    void exchange(Stray& other) noexcept;
     bool unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name, qbxV2::eqbx_error* error);
 
 private:
@@ -258,6 +270,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(Call const& other);
+    void exchange(Call& other) noexcept;
     bool unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name, qbxV2::eqbx_error* error);
 
 private:
@@ -284,6 +298,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(Cat const& other);
+    void exchange(Cat& other) noexcept;
     bool unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name, qbxV2::eqbx_error* error);
 
 private:

@@ -53,7 +53,9 @@ Lens& Lens::operator=(Lens const& other) {
 }
 Lens::~Lens() = default;
 
-void Lens::swap([[maybe_unused]] Lens& other) {
+void Lens::swap(Lens& other) { frame::swap_whole(*this, other); }
+void Lens::make_room_for(Lens const&) {}
+void Lens::exchange([[maybe_unused]] Lens& other) noexcept {
     m_FocalLength.swap(other.m_FocalLength);
 }
 void Lens::reset() { frame::reset_by_swap(*this); }
@@ -103,7 +105,9 @@ CameraBody& CameraBody::operator=(CameraBody const& other) {
 }
 CameraBody::~CameraBody() = default;
 
-void CameraBody::swap([[maybe_unused]] CameraBody& other) {
+void CameraBody::swap(CameraBody& other) { frame::swap_whole(*this, other); }
+void CameraBody::make_room_for(CameraBody const&) {}
+void CameraBody::exchange([[maybe_unused]] CameraBody& other) noexcept {
     m_Maker.swap(other.m_Maker);
 }
 void CameraBody::reset() { frame::reset_by_swap(*this); }
@@ -161,12 +165,20 @@ Camera& Camera::operator=(Camera const& other) {
 }
 Camera::~Camera() = default;
 
-void Camera::swap([[maybe_unused]] Camera& other) {
-    m_Front.swap(other.m_Front);
-    m_Back.swap(other.m_Back);
-    m_Body.swap(other.m_Body);
-    m_Strap.swap(other.m_Strap);
-    m_Tripod.swap(other.m_Tripod);
+void Camera::swap(Camera& other) { frame::swap_whole(*this, other); }
+void Camera::make_room_for(Camera const& other) {
+    m_Front.make_room_for(other.m_Front);
+    m_Back.make_room_for(other.m_Back);
+    m_Body.make_room_for(other.m_Body);
+    m_Strap.make_room_for(other.m_Strap);
+    m_Tripod.make_room_for(other.m_Tripod);
+}
+void Camera::exchange([[maybe_unused]] Camera& other) noexcept {
+    m_Front.exchange(other.m_Front);
+    m_Back.exchange(other.m_Back);
+    m_Body.exchange(other.m_Body);
+    m_Strap.exchange(other.m_Strap);
+    m_Tripod.exchange(other.m_Tripod);
 }
 void Camera::reset() { frame::reset_by_swap(*this); }
 bool Camera::is_occurs_ok() const { return m_Front.is_set() && m_Body.is_set(); }

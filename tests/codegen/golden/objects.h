@@ -33,6 +33,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(Lens const& other);
+    void exchange(Lens& other) noexcept;
     bool unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name, qbxV2::eqbx_error* error);
     qbxV2::eqbx_error unmarshal_attributes_check(qbxV2::c_xml_reader& reader);
     void marshal_attributes(qbxV2::c_xml_writer& out) const;
@@ -62,6 +64,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(CameraBody const& other);
+    void exchange(CameraBody& other) noexcept;
     bool unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name, qbxV2::eqbx_error* error);
     qbxV2::eqbx_error unmarshal_attributes_check(qbxV2::c_xml_reader& reader);
     void marshal_attributes(qbxV2::c_xml_writer& out) const;
@@ -112,6 +116,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(Camera const& other);
+    void exchange(Camera& other) noexcept;
     bool unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name, qbxV2::eqbx_error* error);
     qbxV2::eqbx_error unmarshal_attributes_check(qbxV2::c_xml_reader& reader);
     void marshal_attributes(qbxV2::c_xml_writer& out) const;

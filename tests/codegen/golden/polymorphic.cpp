@@ -50,7 +50,9 @@ AnimalType& AnimalType::operator=(AnimalType const& other) {
 }
 AnimalType::~AnimalType() = default;
 
-void AnimalType::swap([[maybe_unused]] AnimalType& other) {
+void AnimalType::swap(AnimalType& other) { frame::swap_whole(*this, other); }
+void AnimalType::make_room_for(AnimalType const&) {}
+void AnimalType::exchange([[maybe_unused]] AnimalType& other) noexcept {
     m_Tag.swap(other.m_Tag);
     m_Name.swap(other.m_Name);
 }
@@ -137,8 +139,12 @@ BirdType& BirdType::operator=(BirdType const& other) {
 }
 BirdType::~BirdType() = default;
 
-void BirdType::swap([[maybe_unused]] BirdType& other) {
-    AnimalType::swap(other);
+void BirdType::swap(BirdType& other) { frame::swap_whole(*this, other); }
+void BirdType::make_room_for(BirdType const& other) {
+    AnimalType::make_room_for(other);
+}
+void BirdType::exchange([[maybe_unused]] BirdType& other) noexcept {
+    AnimalType::exchange(other);
     m_Span.swap(other.m_Span);
 }
 void BirdType::reset() { frame::reset_by_swap(*this); }
@@ -200,8 +206,12 @@ OwlType& OwlType::operator=(OwlType const& other) {
 }
 OwlType::~OwlType() = default;
 
-void OwlType::swap([[maybe_unused]] OwlType& other) {
-    BirdType::swap(other);
+void OwlType::swap(OwlType& other) { frame::swap_whole(*this, other); }
+void OwlType::make_room_for(OwlType const& other) {
+    BirdType::make_room_for(other);
+}
+void OwlType::exchange([[maybe_unused]] OwlType& other) noexcept {
+    BirdType::exchange(other);
 }
 void OwlType::reset() { frame::reset_by_swap(*this); }
 bool OwlType::is_occurs_ok() const { return BirdType::is_occurs_ok(); }

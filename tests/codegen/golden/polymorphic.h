@@ -47,6 +47,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(AnimalType const& other);
+    void exchange(AnimalType& other) noexcept;
     bool unmarshal_attributes(qbxV2::c_xml_reader& reader, std::string const& name, qbxV2::eqbx_error* error);
     qbxV2::eqbx_error unmarshal_attributes_check(qbxV2::c_xml_reader& reader);
     void marshal_attributes(qbxV2::c_xml_writer& out) const;
@@ -88,6 +90,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(BirdType const& other);
+    void exchange(BirdType& other) noexcept;
     bool unmarshal_body(qbxV2::c_xml_reader& reader, std::string* name, qbxV2::eqbx_error* error);
     qbxV2::eqbx_error marshal_child_elements(qbxV2::c_xml_writer& out) const;
 
@@ -117,6 +121,8 @@ public:
 
 protected:
     friend struct frame::access;
+    void make_room_for(OwlType const& other);
+    void exchange(OwlType& other) noexcept;
 
 private:
 };

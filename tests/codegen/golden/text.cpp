@@ -41,7 +41,9 @@ Weight& Weight::operator=(Weight const& other) {
 }
 Weight::~Weight() = default;
 
-void Weight::swap([[maybe_unused]] Weight& other) {
+void Weight::swap(Weight& other) { frame::swap_whole(*this, other); }
+void Weight::make_room_for(Weight const&) {}
+void Weight::exchange([[maybe_unused]] Weight& other) noexcept {
     m_Unit.swap(other.m_Unit);
     m_Weight.swap(other.m_Weight);
 }
@@ -105,7 +107,9 @@ Remark& Remark::operator=(Remark const& other) {
 }
 Remark::~Remark() = default;
 
-void Remark::swap([[maybe_unused]] Remark& other) {
+void Remark::swap(Remark& other) { frame::swap_whole(*this, other); }
+void Remark::make_room_for(Remark const&) {}
+void Remark::exchange([[maybe_unused]] Remark& other) noexcept {
     m_Remark.swap(other.m_Remark);
 }
 void Remark::reset() { frame::reset_by_swap(*this); }

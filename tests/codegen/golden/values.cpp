@@ -75,7 +75,9 @@ Parcel& Parcel::operator=(Parcel const& other) {
 }
 Parcel::~Parcel() = default;
 
-void Parcel::swap([[maybe_unused]] Parcel& other) {
+void Parcel::swap(Parcel& other) { frame::swap_whole(*this, other); }
+void Parcel::make_room_for(Parcel const&) {}
+void Parcel::exchange([[maybe_unused]] Parcel& other) noexcept {
     m_Fill.swap(other.m_Fill);
     m_Height.swap(other.m_Height);
     m_Tilt.swap(other.m_Tilt);
