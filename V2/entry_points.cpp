@@ -73,6 +73,8 @@ eqbx_error Vrl::writeFile(std::wstring const& path) const {
 
 XMLDocumentResult Vrl::writeString() const {
     std::ostringstream os;
+    // Memory that runs out would else end the text early, with no code to tell of it.
+    os.exceptions(std::ios_base::badbit);
     const eqbx_error result = write_text(*this, os);
     std::wstring document;
     if (result == qbxV2::EQBX_NO_ERROR) qbxV2::convert(&document, std::move(os).str());

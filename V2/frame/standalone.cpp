@@ -13,6 +13,8 @@ eqbx_error marshal_to_stream(const document_element& element, std::ostream& os) 
 
 eqbx_error marshal_to_string(const document_element& element, std::string* text) {
     std::ostringstream os;
+    // Memory that runs out would else end the text early, with no code to tell of it.
+    os.exceptions(std::ios_base::badbit);
     const eqbx_error result = marshal_to_stream(element, os);
     if (result == qbxV2::EQBX_NO_ERROR) *text = std::move(os).str();
     return result;
