@@ -233,6 +233,23 @@ TEST(LoadString, TakesTextForUtf8) {
     EXPECT_EQ(declared.get_Color(0).get_ColorName(), name);
 }
 
+// Intended: the text is handed on as UTF-8, and the reader judges what its declaration says of that.
+TEST(LoadString, LeavesTheDeclaredEncodingToTheReader) {
+    const auto declared = [](const wchar_t* encoding) {
+        std::wstring xml = widened(vrl_test::document(vrl_test::color("@")));
+        xml.replace(xml.find(L'@'), 1, L"\x00E9");
+        return std::wstring(L"<?xml version=\"1.0\" encoding=\"")
+            .append(encoding)
+            .append(L"\"?>")
+            .append(xml);
+    };
+    EXPECT_EQ(Vrl().loadString(declared(L"UTF-16")), 15) << "the bytes contradict it";
+    EXPECT_EQ(Vrl().loadString(declared(L"EBCDIC")), 6);
+    Vrl document;
+    EXPECT_EQ(document.loadString(declared(L"ISO-8859-1")), 0);
+    EXPECT_EQ(document.get_Color(0).get_ColorName(), L"\x00C3\x00A9") << "each byte is a character then";
+}
+
 TEST(LoadString, ReturnsTheReadersCode) {
     Vrl document;
     EXPECT_EQ(document.loadString(L""), 34);

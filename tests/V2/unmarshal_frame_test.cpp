@@ -207,6 +207,17 @@ TEST(End, OfAnotherNameIsBad) {
     EXPECT_EQ(read_element(density, "<Vrl:Density>1</Vrl:Density >").code, 0);
 }
 
+TEST(End, OfAnotherNameIsBadBehindNoContentToo) {
+    OwnerType owner;
+    EXPECT_EQ(read_element(owner, "<Vrl:Owner></Vrl:Other>").code, 10) << "though it may be empty";
+    Standard standard;
+    EXPECT_EQ(read_element(standard, "<Vrl:Standard xsi:nil=\"true\"></Vrl:Other>").code, 10);
+    Density density;
+    EXPECT_EQ(read_element(density, "<Vrl:Density xsi:nil=\"true\"></Vrl:Other>").code, 10);
+    SDKVersion version;
+    EXPECT_EQ(read_element(version, "<Vrl:SDKVersion></Vrl:Other>").code, 10);
+}
+
 TEST(End, IsBadWhereAStrangerStands) {
     Vrl document;
     const auto result = vrl_test::read_document(document, vrl_test::document("<Vrl:Stranger/>"));

@@ -259,6 +259,29 @@ TEST(Revision, ThatCannotBeReadIsReported) {
     EXPECT_EQ(revision.size_any(), 1u) << "an entry is there before it is read";
 }
 
+// Intended: two elements of one name have different types, by their place.
+TEST(Colorant, OfARecipeNeedsItsNameAloneAndThatOfAColorantElementAllFour) {
+    const std::string name = element("Name", "n");
+    const auto missed = [](auto object, const std::string& content) {
+        return items_of(read_element(object, element("Colorant", content), forgive), 21);
+    };
+    EXPECT_EQ(missed(Colorant(), name), texts{});
+    EXPECT_EQ(missed(ColorantElementType_Colorant(), name),
+              (texts{"Vrl:Manufacturer", "Vrl:PartNumber", "Vrl:Density"}));
+    EXPECT_EQ(missed(Colorant(), element("Manufacturer", "m")), texts{"Vrl:Name"});
+
+    Colorant colorant;
+    colorant.set_Name(L"n");
+    EXPECT_TRUE(colorant.is_occurs_ok());
+    ColorantElementType_Colorant other;
+    other.set_Name(L"n");
+    other.set_Manufacturer(L"m");
+    other.set_PartNumber(L"p");
+    EXPECT_FALSE(other.is_occurs_ok());
+    other.get_Density().setnil_Density();
+    EXPECT_TRUE(other.is_occurs_ok()) << "its density is an element of its own, which may be nil";
+}
+
 TEST(Head, OfAPaletteAndOfASetAndOfAColorIsTheSame) {
     const std::string head =
         element("CustomAttribute",
