@@ -104,6 +104,7 @@ bool c_get_with_entities::admit_entity_text(const char* value) {
         m_expanded += size;
         return true;
     }
+    m_has_exceeded_expansion = true;
     error(EQBX_ET_FATAL, EQBX_BAD_DTD,
           "Entity expansion exceeds the limit of " + std::to_string(m_max_expansion) + " bytes");
     return false;

@@ -72,6 +72,8 @@ public:
     /// Counts the bytes of an entity value that is about to be delivered. False after a fatal EQBX_BAD_DTD
     /// report.
     bool admit_entity_text(const char* value);
+    /// Whether the limit has refused something: its report alone cannot be told from that of a bad DTD.
+    bool has_exceeded_entity_expansion() const { return m_has_exceeded_expansion; }
     /// The fatal report of an entity that contains itself. Always false.
     bool refuse_recursion(const char* value);
 
@@ -98,6 +100,7 @@ private:
     std::vector<std::unique_ptr<char[]>> m_kept_texts;
     std::size_t m_expanded = 0;
     std::size_t m_max_expansion = k_default_max_entity_expansion;
+    bool m_has_exceeded_expansion = false;
 };
 
 /// Where the characters of a reference come from, from behind its "&". In input mode an entity's text becomes

@@ -77,6 +77,7 @@ public:
     void add_parameter_entity(const std::string& name, const std::string& value);
     /// See `c_get_with_entities`.
     void set_max_entity_expansion(std::size_t bytes) { m_getter.set_max_entity_expansion(bytes); }
+    bool has_exceeded_entity_expansion() const { return m_getter.has_exceeded_entity_expansion(); }
     /// See `c_get_as_utf8`.
     void use_runs(bool on) { m_getter.use_runs(on); }
 

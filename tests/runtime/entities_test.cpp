@@ -168,6 +168,7 @@ TEST(EntityExpansion, IsLimitedForInputAndForValuesTogether) {
         EXPECT_TRUE(xml.skip_start_tag(&is_empty));
         EXPECT_EQ(xml.get_element_value(&name, EQBX_WS_PRESERVE, true), fits);
         EXPECT_EQ(log, fits ? "" : " !0/9@1: Entity expansion exceeds the limit of 11 bytes");
+        EXPECT_EQ(xml.has_exceeded_entity_expansion(), !fits);
     }
 }
 
