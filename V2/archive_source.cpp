@@ -8,10 +8,9 @@ namespace {
 constexpr int k_entry_is_whole = 1;
 /// Smaller texts harm nobody, however well they are packed.
 constexpr std::uint64_t k_free_of_ratio = std::uint64_t{1} << 20;
-constexpr char k_what[] = "the packed document cannot be read";
 
 file_outcome bad_archive(const std::string& why) {
-    return failed(file_failure::bad_archive, std::string(k_what) + ": " + why);
+    return failed(file_failure::bad_archive, std::string(k_cannot_be_read) + ": " + why);
 }
 
 }  // namespace
@@ -26,7 +25,7 @@ archive_source::archive_source(CZipAbstractFile& file, const load_options& optio
 }
 
 void archive_source::fail_with(const CZipException& exception) {
-    fail(failed_archive(k_what, exception.GetCode()));
+    fail(failed_archive(k_cannot_be_read, exception.GetCode()));
 }
 
 void archive_source::open(CZipAbstractFile& file) {
@@ -76,7 +75,7 @@ std::string_view archive_source::fetch() {
     try {
         const std::uint32_t got = m_archive.ReadEntry(m_window.get(), k_window);
         // A declared packed size can be a lie, too: what counts is how much of it has been used up.
-        const std::uint32_t used = m_packed - m_archive.GetCompressor()->GetCompressedLeft();
+        const std::uint32_t used = m_packed - m_archive.GetCompressor()->GetUnusedInput();
         if (!is_within_ratio(fetched() + got, used)) {
             refuse_ratio();
             return {};
@@ -98,6 +97,8 @@ void archive_source::check_end() {
         char more = 0;
         if (m_archive.ReadEntry(&more, 1) != 0) {
             fail(bad_archive("it goes on behind its declared size"));
+        } else if (const std::uint32_t unused = m_archive.GetCompressor()->GetUnusedInput()) {
+            fail(bad_archive("it is packed in " + std::to_string(unused) + " bytes less than declared"));
         } else if (m_archive.CloseEntry() != k_entry_is_whole) {
             fail(bad_archive("the entry is not whole"));
         } else {

@@ -9,6 +9,9 @@
 
 namespace vrl_v2 {
 
+/// How messages begin that say why.
+inline constexpr char k_cannot_be_read[] = "the packed document cannot be read";
+
 /// The first entry of an archive, inflated piece by piece as the reader asks for it.
 ///
 /// What the archive says about the entry is judged: at the opening (local header against directory, declared

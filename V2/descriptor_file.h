@@ -7,7 +7,8 @@ namespace vrl_v2 {
 
 /// A file that is open already, as the ZIP engine wants to see it. Borrows the descriptor.
 ///
-/// Failure   CZipException with the errno of the call; EFBIG for positions above 32 bits.
+/// Failure   CZipException with the errno of the call; EFBIG for positions above 32 bits. Some errno values
+///           are codes of the engine, too (EDQUOT is 122 on Linux): `call_error` is never in doubt.
 class descriptor_file : public CZipAbstractFile {
 public:
     descriptor_file(vrl_platform::file_descriptors& files, int descriptor)
@@ -27,11 +28,16 @@ public:
     void Write(const void* buffer, std::uint32_t count) override;
     bool IsClosed() const override { return false; }
 
+    /// The errno of the first call of the system that failed; 0 when none did.
+    int call_error() const { return m_call_error; }
+
 private:
+    [[noreturn]] void raise_call(int error) const;
     std::uint32_t move(std::int64_t offset, vrl_platform::seek_origin origin) const;
 
     vrl_platform::file_descriptors& m_files;
     int m_descriptor;
+    mutable int m_call_error = 0;
 };
 
 }  // namespace vrl_v2

@@ -21,8 +21,8 @@
 ///   plain    the XML text, ".vrl"
 ///   packed   a ZIP archive whose first entry is the XML text, ".vrlz"
 ///
-/// Failure   by result; nothing here throws for anything that a file, a disk or a document can do.
-///           std::bad_alloc passes.
+/// Failure   by result; nothing here throws for anything that a file, a stream, a disk or a document can do.
+///           std::bad_alloc passes; memory that a compressor could not have is a system_error.
 /// Threads   calls are independent. Saving only reads the document: several threads may save one at a time.
 namespace vrl_v2 {
 
@@ -66,7 +66,8 @@ struct file_outcome {
 /// cannot be known: when saving, and for a stream. False cancels.
 ///
 /// Loading counts bytes of the XML text, out of the file or out of the archive; saving those of the text as
-/// it is written, before it is packed. The callback must not throw: an exception counts as false.
+/// it is written, before it is packed. While a packed stream is taken in, before it is unpacked, nothing is
+/// done yet: the callback is asked with 0. It must not throw: an exception counts as false.
 using progress_callback = std::function<bool(std::uint64_t done, std::uint64_t total)>;
 
 /// One thing that is wrong with a document.
@@ -88,12 +89,13 @@ struct load_options {
     /// Reading ends with this many reports.
     std::size_t max_reports = 1000;
 
-    /// Packed files: the largest text, in bytes, whether declared or found.
+    /// Packed files: the largest text, in bytes, whether declared or found. What comes from a stream or a
+    /// pipe and has to be held as it is packed must not be larger either.
     std::uint64_t max_unpacked_size = std::uint64_t{2} << 30;
     /// Packed files: how many times as large as its packed form the text may be, beyond its first MiB.
     /// Deflate reaches some 1030; documents reach 20 to 100.
     unsigned max_ratio = 500;
-    /// Open elements.
+    /// How many elements may be open at a time.
     unsigned max_depth = qbxV2::c_xml_reader::k_default_max_depth;
     /// What entities may deliver, in bytes.
     std::size_t max_entity_expansion = qbxV2::c_get_with_entities::k_default_max_entity_expansion;
@@ -115,7 +117,8 @@ struct [[nodiscard]] load_result : file_outcome {
 ///           and never held as a whole. Its CRC, its size and its local header must agree with the archive's
 ///           directory, and its stream must end where it says; otherwise there is no document, even if all of
 ///           it could be read.
-/// Memory    above the document's own some 0.5 MB, however large the file.
+/// Memory    above the document's own some 0.5 MB, however large the file. A packed document that comes
+///           through a pipe is held as it is packed, as from a stream.
 [[nodiscard]] VRL_API load_result load_document(const std::filesystem::path& path,
                                                 const load_options& options = {});
 /// From where the stream stands; it may be read beyond the end of the document. A packed document is held in
@@ -149,8 +152,10 @@ struct [[nodiscard]] save_result : file_outcome {};
 ///           library, in the file only. A packed file has one entry, named after the path's stem and ".vrl".
 /// How       Everything goes to a file of a new name in the same folder (".vrl-" and 12 digits), which is
 ///           flushed to the disk and then takes the target's place in one step; then the folder is flushed.
-///           The target's mode, and its owner where the process may, are kept; a symbolic link stays and its
-///           target is replaced. On failure the new file is gone. Only when the process is killed, or the
+///           The target's mode, and its owner where the process may, are kept; where its group cannot be, the
+///           group gets no rights that not everybody has. A symbolic link stays, and what it leads to is
+///           replaced, or made. Other hard links keep the old document; access lists and extended attributes
+///           are a new file's. On failure the new file is gone. Only when the process is killed, or the
 ///           power, it stays behind.
 /// Failure   as told at `file_failure`. A document that is not complete is refused (bad_document), and so is
 ///           one whose `WriteSDKInformation` is there and not complete. A write-protected target is not

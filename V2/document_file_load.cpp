@@ -27,10 +27,16 @@ bool is_packed(document_source& source, const load_options& options) {
     return looks_packed(source.peek());
 }
 
-file_outcome outcome_of(const std::vector<load_report>& reports, bool too_deep) {
+load_result failed_load(file_outcome outcome) {
+    load_result result;
+    static_cast<file_outcome&>(result) = std::move(outcome);
+    return result;
+}
+
+file_outcome outcome_of(const std::vector<load_report>& reports, bool limit_exceeded) {
     const load_report& first = reports.front();
     file_outcome outcome =
-        failed(too_deep ? file_failure::limit_exceeded : file_failure::bad_document, first.message);
+        failed(limit_exceeded ? file_failure::limit_exceeded : file_failure::bad_document, first.message);
     outcome.code = first.code;
     outcome.line = first.line;
     outcome.item = first.item;
@@ -42,21 +48,18 @@ file_outcome outcome_of(const std::vector<load_report>& reports, bool too_deep) 
 
 /// Reads the document, then judges the source: only what came from a good one is handed over.
 load_result read_document(document_source& source, const load_options& options) {
-    load_result result;
     auto document = std::make_unique<Vrl>();
     reporting_reader reader(source, options);
     const eqbx_error code = document->unmarshal(reader);
     if (code != qbxV2::EQBX_NO_ERROR && reader.reports().empty()) reader.note(code);
     source.finish();
-    if (!source.problem()) {
-        static_cast<file_outcome&>(result) = source.problem();
-        return result;
-    }
+    if (!source.problem()) return failed_load(source.problem());
+    load_result result;
     result.reports = std::move(reader.reports());
     if (result.reports.empty()) {
         result.document = std::move(document);
     } else {
-        static_cast<file_outcome&>(result) = outcome_of(result.reports, reader.is_too_deep());
+        static_cast<file_outcome&>(result) = outcome_of(result.reports, reader.is_limit_exceeded());
     }
     return result;
 }
@@ -68,23 +71,31 @@ load_result read_archive(CZipAbstractFile& file, const load_options& options) {
 
 load_result read_archive(std::string_view bytes, const load_options& options) {
     if (bytes.size() > 0xFFFFFFFF) {
-        load_result result;
-        static_cast<file_outcome&>(result) =
-            failed(file_failure::limit_exceeded, "an archive of 4 GB and more cannot be read");
-        return result;
+        return failed_load(
+            failed(file_failure::limit_exceeded, "an archive of 4 GB and more cannot be read"));
     }
     // Only read from, and never grown: the block stays what it is.
     CZipMemFile file(const_cast<char*>(bytes.data()), static_cast<std::uint32_t>(bytes.size()), 0);
     return read_archive(file, options);
 }
 
+/// An archive that comes from where nobody can go back to its end: it is held as it is packed. What holds for
+/// the text holds for that all the more.
+load_result read_held_archive(document_source& source, const load_options& options) {
+    const std::string bytes = source.take_all(options.max_unpacked_size);
+    return source.problem() ? read_archive(bytes, options) : failed_load(source.problem());
+}
+
 load_result read_descriptor(int descriptor, const load_options& options, const file_access& access) {
     {
         descriptor_source source(access.files, descriptor, options.progress);
         if (!is_packed(source, options)) return read_document(source, options);
+        if (!source.can_seek()) return read_held_archive(source, options);
     }
     descriptor_file file(access.files, descriptor);
-    return read_archive(file, options);
+    load_result result = read_archive(file, options);
+    return file.call_error() == 0 ? std::move(result)
+                                  : failed_load(failed_call(k_cannot_be_read, file.call_error()));
 }
 
 load_result placed(load_result result, const std::string& name) {
@@ -104,9 +115,7 @@ load_result load_document(const std::filesystem::path& path, const load_options&
                           const file_access& access) {
     const vrl_platform::io_result opened = access.exchange.open(path);
     if (opened.value < 0) {
-        load_result result;
-        static_cast<file_outcome&>(result) = failed_opening("cannot be opened", opened.error);
-        return placed(std::move(result), as_text(path));
+        return placed(failed_load(failed_opening("cannot be opened", opened.error)), as_text(path));
     }
     // Closed however the reading ends; a file that was only read has nothing to lose by it.
     struct closing {
@@ -126,13 +135,7 @@ load_result load_document(const std::filesystem::path& path, const load_options&
 load_result load_document(std::istream& stream, const load_options& options) {
     stream_source source(stream, options.progress);
     if (!is_packed(source, options)) return placed(read_document(source, options), {});
-    const std::string bytes = source.read_all();
-    if (!source.problem()) {
-        load_result result;
-        static_cast<file_outcome&>(result) = source.problem();
-        return result;
-    }
-    return placed(read_archive(bytes, options), {});
+    return placed(read_held_archive(source, options), {});
 }
 
 load_result load_document_from_memory(std::string_view bytes, const load_options& options) {

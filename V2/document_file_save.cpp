@@ -17,6 +17,7 @@ namespace {
 constexpr char k_plain_suffix[] = ".vrl";
 constexpr char k_packed_suffix[] = ".vrlz";
 constexpr char k_unnamed[] = "document";
+constexpr char k_cannot_be_written[] = "the packed document cannot be written";
 /// APPNOTE 4.6.9: the name of an entry in UTF-8, beside the one in a code page.
 constexpr std::uint16_t k_unicode_path = 0x7075;
 constexpr std::uint32_t k_archive_attribute = 0x20;
@@ -102,7 +103,7 @@ file_outcome write_packed(const Vrl& document, CZipAbstractFile& file, const std
         }
         return outcome;
     } catch (const CZipException& exception) {
-        return failed_archive("the packed document cannot be written", exception.GetCode());
+        return failed_archive(k_cannot_be_written, exception.GetCode());
     }
 }
 
@@ -125,7 +126,8 @@ file_outcome write_to(replaced_file& file, const Vrl& document, file_format form
                       const save_options& options, const file_access& access) {
     if (format == file_format::packed) {
         descriptor_file archive(access.files, file.descriptor());
-        return write_packed(document, archive, name, options);
+        const file_outcome outcome = write_packed(document, archive, name, options);
+        return archive.call_error() == 0 ? outcome : failed_call(k_cannot_be_written, archive.call_error());
     }
     descriptor_output out(access.files, file.descriptor(), line_ends::cr_lf, options.progress);
     return write_document(document, out);
@@ -155,7 +157,9 @@ save_result result_of(file_outcome outcome, const std::string& name) {
 
 save_result save_document(const Vrl& document, const std::filesystem::path& path, const save_options& options,
                           const file_access& access) {
-    return result_of(save_to(path, document, options, access), as_text(path));
+    // Whatever takes memory comes before the file takes its place: afterwards nothing may throw.
+    const std::string name = as_text(path);
+    return result_of(save_to(path, document, options, access), name);
 }
 
 save_result save_document(const Vrl& document, const std::filesystem::path& path,

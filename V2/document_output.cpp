@@ -66,6 +66,8 @@ void document_output::put_what_waits() {
         fail(failed(file_failure::system_error, "out of memory"));
     } catch (const std::exception& thrown) {
         fail(failed(file_failure::system_error, std::string("writing failed: ") + thrown.what()));
+    } catch (...) {
+        fail(failed(file_failure::system_error, "writing failed"));
     }
 }
 

@@ -47,6 +47,21 @@ bool document_source::advance() {
     return !has_failed();
 }
 
+std::string document_source::take_all(std::uint64_t most) {
+    std::string all;
+    for (std::string_view piece = peek(); !piece.empty(); piece = fetch()) {
+        all += piece;
+        if (all.size() > most) {
+            fail(failed(file_failure::limit_exceeded,
+                        "the packed document has more than " + std::to_string(most) + " bytes itself"));
+        } else {
+            tell_progress();
+        }
+        if (has_failed()) break;
+    }
+    return all;
+}
+
 void document_source::tell_progress() {
     if (!m_progress) return;
     bool go_on = false;
@@ -82,6 +97,7 @@ descriptor_source::descriptor_source(vrl_platform::file_descriptors& files, int 
     // What cannot seek has no size that could be told.
     const auto size = m_files.seek(m_descriptor, 0, seek_origin::end);
     if (size.value < 0) return;
+    m_can_seek = true;
     set_total(static_cast<std::uint64_t>(size.value));
     const auto begin = m_files.seek(m_descriptor, 0, seek_origin::begin);
     if (begin.value != 0) fail(failed_call("cannot be read", begin.error));
@@ -114,13 +130,10 @@ std::string_view stream_source::fetch() {
     } catch (const std::exception& thrown) {
         fail(failed(file_failure::system_error, std::string("reading the stream failed: ") + thrown.what()));
         return {};
+    } catch (...) {
+        fail(failed(file_failure::system_error, "reading the stream failed"));
+        return {};
     }
-}
-
-std::string stream_source::read_all() {
-    std::string all(peek());
-    for (std::string_view more = fetch(); !more.empty(); more = fetch()) all += more;
-    return all;
 }
 
 memory_source::memory_source(std::string_view bytes, const progress_callback& progress)

@@ -30,6 +30,9 @@ public:
 
     /// The first piece, which stays to be read. Empty when there is none.
     std::string_view peek();
+    /// All that is left, the first piece included, instead of reading it. Asks whether to go on after each
+    /// piece, with nothing done yet. Fails as soon as there are more bytes than `most`.
+    std::string take_all(std::uint64_t most);
     /// Behind the reading: reads on as far as that serves to check the source itself.
     void finish();
     /// What kept the source from delivering all; no failure if nothing did.
@@ -70,12 +73,16 @@ public:
     descriptor_source(vrl_platform::file_descriptors& files, int descriptor,
                       const progress_callback& progress);
 
+    /// Not so for a pipe.
+    bool can_seek() const { return m_can_seek; }
+
 protected:
     std::string_view fetch() override;
 
 private:
     vrl_platform::file_descriptors& m_files;
     int m_descriptor;
+    bool m_can_seek = false;
     std::unique_ptr<char[]> m_window;
 };
 
@@ -83,9 +90,6 @@ private:
 class stream_source : public document_source {
 public:
     stream_source(std::istream& stream, const progress_callback& progress);
-
-    /// All that is left, the first piece included. Stops with `fail` when a read fails.
-    std::string read_all();
 
 protected:
     std::string_view fetch() override;

@@ -5,12 +5,10 @@
 
 #include "V2/archive_message.h"
 #include "platform/file_exchange.h"
+#include "zip/exception.h"
 
 namespace vrl_v2 {
 namespace {
-
-// Codes of the ZIP engine below this are errno values.
-constexpr int k_first_archive_code = 100;
 
 qbxV2::eqbx_error code_of(file_failure failure) {
     switch (failure) {
@@ -64,8 +62,10 @@ file_outcome failed_archive(const std::string& what, int code) {
     if (code == EFBIG) {
         return failed(file_failure::limit_exceeded, what + ": a packed file can hold 4 GB at most");
     }
-    if (code < k_first_archive_code) return failed_call(what, code);
-    return failed(file_failure::bad_archive, what + ": " + archive_message(code));
+    const bool is_memory = code == CZipException::vectorNotGrown || code == CZipException::zlibMemory ||
+                           code == CZipException::bzip2Memory;
+    return failed(is_memory ? file_failure::system_error : file_failure::bad_archive,
+                  what + ": " + archive_message(code));
 }
 
 void place(file_outcome& outcome, const std::string& name) {

@@ -14,8 +14,8 @@ file_outcome failed(file_failure failure, const std::string& what);
 file_outcome failed_call(const std::string& what, int error);
 /// A file that could not be opened or made, with an errno value.
 file_outcome failed_opening(const std::string& what, int error);
-/// What a ZIP engine's exception means: its errno values are the system's, others speak of the archive.
-/// `what` is what was tried.
+/// What a ZIP engine's exception means that does not come from a call of the system. `what` is what was
+/// tried.
 file_outcome failed_archive(const std::string& what, int code);
 
 /// Puts the name of the file, if there is one, and the line, if there is one, before a message.

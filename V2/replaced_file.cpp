@@ -34,7 +34,7 @@ file_outcome replaced_file::commit() {
     if (const int error = m_access.exchange.replace(m_file.path, m_file.target))
         return failed_call("the saved file cannot take its place", error);
     m_pending = false;
-    if (const int error = m_access.exchange.commit_folder(m_file.target))
+    if (const int error = m_access.exchange.commit_folder(m_file.folder))
         return failed_call(
             "saved, but the folder cannot be flushed: after a power cut the old file may be back", error);
     return {};

@@ -18,18 +18,26 @@ eqbx_error reporting_reader::user_handle_error(eqbx_error code, const std::strin
     report.code = code;
     report.line = get_line_no();
     report.item = item;
-    const bool too_deep = code == qbxV2::EQBX_BADLY_FORMED && depth() > get_max_depth();
-    if (too_deep) {
-        report.message = "elements are nested more than " + std::to_string(get_max_depth()) + " deep";
-        m_too_deep = m_reports.empty();
-    } else {
+    report.message = exceeded_limit(code);
+    if (report.message.empty()) {
         report.message = report_message(*this, get_element_name_stack(), value_buffer(), code, item);
+    } else if (m_reports.empty()) {
+        m_limit_exceeded = true;
     }
     m_reports.push_back(report);
     if (!can_go_on(code)) return code;
     const bool at_surplus_content =
         code == qbxV2::EQBX_BAD_END_OF_ELEMENT && is_at_content() && is_within(item);
     return !at_surplus_content || skip_to_end_of_element() ? qbxV2::EQBX_NO_ERROR : code;
+}
+
+/// In words; empty when it is none.
+std::string reporting_reader::exceeded_limit(eqbx_error code) {
+    if (code == qbxV2::EQBX_BADLY_FORMED && depth() > get_max_depth())
+        return "elements are nested more than " + std::to_string(get_max_depth()) + " deep";
+    if (has_exceeded_entity_expansion())
+        return "entities expand to more than " + std::to_string(m_options.max_entity_expansion) + " bytes";
+    return {};
 }
 
 bool reporting_reader::can_go_on(eqbx_error code) const {

@@ -25,10 +25,11 @@ public:
     /// Notes what ended the reading without having been reported.
     void note(qbxV2::eqbx_error code);
     std::vector<load_report>& reports() { return m_reports; }
-    /// Whether the first report is that of a document that nests too deeply.
-    bool is_too_deep() const { return m_too_deep; }
+    /// Whether the first report is that of a limit of the options.
+    bool is_limit_exceeded() const { return m_limit_exceeded; }
 
 private:
+    std::string exceeded_limit(qbxV2::eqbx_error code);
     bool can_go_on(qbxV2::eqbx_error code) const;
     bool is_at_content() const;
     bool is_within(const std::string& element);
@@ -37,7 +38,7 @@ private:
     document_source& m_source;
     const load_options& m_options;
     std::vector<load_report> m_reports;
-    bool m_too_deep = false;
+    bool m_limit_exceeded = false;
 };
 
 }  // namespace vrl_v2

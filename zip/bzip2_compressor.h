@@ -30,6 +30,7 @@ public:
     std::uint32_t Decompress(void* buffer, std::uint32_t size) override;
     void EndCompression(bool afterException) override;
     void EndDecompression(bool afterException) override;
+    std::uint32_t GetUnusedInput() const override { return m_compressedLeft + m_stream.avail_in; }
     const CZipCompressor::COptions* GetOptions() const override { return &m_options; }
     void ApplyOptions(const CZipCompressor::COptions& options) override;
     int MapLibraryResult(int result) const override;

@@ -63,6 +63,8 @@ public:
     std::uint32_t GetUncompressedLeft() const { return m_uncompressedLeft; }
     /// Bytes of the compressed stream that have not been read from the storage.
     std::uint32_t GetCompressedLeft() const { return m_compressedLeft; }
+    /// Those, and what has been read and not used: behind the end of the stream there should be none.
+    virtual std::uint32_t GetUnusedInput() const { return m_compressedLeft; }
     /// Of all bytes delivered so far.
     std::uint32_t GetCrc() const { return m_crc; }
 

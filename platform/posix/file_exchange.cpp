@@ -20,14 +20,28 @@ namespace {
 namespace fs = std::filesystem;
 
 constexpr int k_most_names = 100;
+// As many as Linux follows. (path_resolution(7))
+constexpr int k_most_links = 40;
 constexpr mode_t k_mode_bits = 07777;
 
-/// Where a chain of links ends. A link that leads nowhere stays what it is.
-fs::path resolve(const fs::path& path) {
+/// The file at the end of a chain of links.
+fs::path behind_links(const fs::path& path) {
     std::error_code error;
     if (!fs::is_symlink(path, error)) return path;
     fs::path resolved = fs::canonical(path, error);
     return error ? path : resolved;
+}
+
+/// The name at the end of a chain of links that leads to no file.
+fs::path missing_behind_links(const fs::path& path) {
+    fs::path end = path;
+    std::error_code error;
+    for (int i = 0; i < k_most_links && fs::is_symlink(end, error); ++i) {
+        const fs::path next = fs::read_symlink(end, error);
+        if (error) break;
+        end = end.parent_path() / next;
+    }
+    return end;
 }
 
 fs::path folder_of(const fs::path& path) {
@@ -58,12 +72,21 @@ int refusal(const fs::path& target, const struct stat& status) {
     return ::faccessat(AT_FDCWD, target.c_str(), W_OK, AT_EACCESS) == 0 ? 0 : errno;
 }
 
+/// What the group may do is for another group than the one that was meant: no more than everybody may.
+mode_t with_group_as_others(mode_t mode) {
+    const mode_t others_as_group = (mode & S_IRWXO) << 3;
+    return (mode & ~static_cast<mode_t>(S_IRWXG)) | (mode & others_as_group);
+}
+
 /// The owner first: changing it takes some mode bits away.
 void dress_like(int descriptor, const struct stat& status) {
-    const bool owned = ::fchown(descriptor, status.st_uid, status.st_gid) == 0;
-    const mode_t mode = status.st_mode & k_mode_bits;
+    constexpr auto k_keep = static_cast<uid_t>(-1);
+    const bool is_owned = ::fchown(descriptor, status.st_uid, status.st_gid) == 0;
+    const bool is_of_group = is_owned || ::fchown(descriptor, k_keep, status.st_gid) == 0;
+    mode_t mode = status.st_mode & k_mode_bits;
     // Bits that lend the owner's rights are for the old owner's files only.
-    ::fchmod(descriptor, owned ? mode : mode & ~static_cast<mode_t>(S_ISUID | S_ISGID));
+    if (!is_owned) mode &= ~static_cast<mode_t>(S_ISUID | S_ISGID);
+    ::fchmod(descriptor, is_of_group ? mode : with_group_as_others(mode));
 }
 
 class posix_file_exchange : public file_exchange {
@@ -80,25 +103,26 @@ public:
 
     replacement create_beside(const fs::path& given) override {
         replacement made;
-        made.target = resolve(given);
         struct stat status {};
-        const bool exists = ::stat(made.target.c_str(), &status) == 0;
+        const bool exists = ::stat(given.c_str(), &status) == 0;
         if (!exists && (errno != ENOENT || given.empty())) made.error = errno;
-        if (exists) made.error = refusal(made.target, status);
+        if (exists) made.error = refusal(given, status);
         if (made.error != 0) return made;
+        made.target = exists ? behind_links(given) : missing_behind_links(given);
+        made.folder = folder_of(made.target);
         make_file(made, exists ? S_IRUSR | S_IWUSR : 0666);
         if (exists && made.error == 0) dress_like(made.descriptor, status);
         return made;
     }
 
-    int replace(const fs::path& from, const fs::path& to) override {
+    int replace(const fs::path& from, const fs::path& to) noexcept override {
         return ::rename(from.c_str(), to.c_str()) == 0 ? 0 : errno;
     }
 
-    int remove(const fs::path& path) override { return ::unlink(path.c_str()) == 0 ? 0 : errno; }
+    int remove(const fs::path& path) noexcept override { return ::unlink(path.c_str()) == 0 ? 0 : errno; }
 
-    int commit_folder(const fs::path& path) override {
-        const int descriptor = ::open(folder_of(path).c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC);
+    int commit_folder(const fs::path& folder) noexcept override {
+        const int descriptor = ::open(folder.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC);
         // A folder that may be written and not read has no flush either.
         if (descriptor < 0) return errno == EACCES ? 0 : errno;
         const int error = ::fsync(descriptor) == 0 ? 0 : errno;
@@ -108,9 +132,8 @@ public:
 
 private:
     static void make_file(replacement& made, mode_t mode) {
-        const fs::path folder = made.target.parent_path();
         for (int i = 0; i < k_most_names; ++i) {
-            made.path = folder / new_name();
+            made.path = made.folder / new_name();
             made.descriptor =
                 ::open(made.path.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC | O_NOFOLLOW, mode);
             if (made.descriptor >= 0) return;

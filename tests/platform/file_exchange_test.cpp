@@ -1,7 +1,9 @@
 #include "platform/file_exchange.h"
 
+#include <grp.h>
 #include <gtest/gtest.h>
 #include <sys/stat.h>
+#include <sys/wait.h>
 #include <unistd.h>
 
 #include <cerrno>
@@ -85,13 +87,28 @@ TEST_F(FileExchange, PutsOneFileInTheOthersPlace) {
     EXPECT_EQ(native_file_exchange().replace(made.path, made.target), 0);
     EXPECT_EQ(read(target), "new");
     EXPECT_EQ(count(), 1u);
-    EXPECT_EQ(native_file_exchange().commit_folder(target), 0);
+    EXPECT_EQ(made.folder, folder);
+    EXPECT_EQ(native_file_exchange().commit_folder(made.folder), 0);
     EXPECT_EQ(native_file_exchange().replace(made.path, made.target), ENOENT);
 }
 
-TEST_F(FileExchange, FlushesTheCurrentFolderForABareName) {
-    EXPECT_EQ(native_file_exchange().commit_folder("a"), 0);
-    EXPECT_EQ(native_file_exchange().commit_folder(folder / "none" / "a"), ENOENT);
+TEST_F(FileExchange, FlushesFoldersOnly) {
+    EXPECT_EQ(native_file_exchange().commit_folder(folder), 0);
+    EXPECT_EQ(native_file_exchange().commit_folder(folder / "none"), ENOENT);
+    EXPECT_EQ(native_file_exchange().commit_folder(write("a", "")), ENOTDIR);
+}
+
+TEST_F(FileExchange, WorksInTheCurrentFolderForABareName) {
+    const fs::path before = fs::current_path();
+    fs::current_path(folder);
+    const replacement made = native_file_exchange().create_beside("a");
+    fill(made, "new");
+    EXPECT_EQ(made.folder, ".");
+    EXPECT_EQ(native_file_exchange().replace(made.path, made.target), 0);
+    EXPECT_EQ(native_file_exchange().commit_folder(made.folder), 0);
+    fs::current_path(before);
+    EXPECT_EQ(read(folder / "a"), "new");
+    EXPECT_EQ(count(), 1u);
 }
 
 TEST_F(FileExchange, RemovesFilesOnly) {
@@ -111,6 +128,27 @@ TEST_F(FileExchange, KeepsTheModeOfTheTarget) {
     }
 }
 
+TEST_F(FileExchange, GivesAForeignGroupNoMoreThanEverybody) {
+    const fs::path target = write("a", "old");
+    fs::permissions(target, fs::perms(0676));
+    fs::permissions(folder, fs::perms(0777));
+    const bool is_root = ::geteuid() == 0;
+    // Only who may become somebody else can meet a file of a group that is not his.
+    const pid_t child = ::fork();
+    if (child == 0) {
+        constexpr gid_t k_nobody = 65534;
+        if (is_root && (::setgroups(0, nullptr) != 0 || ::setegid(k_nobody) != 0 || ::seteuid(k_nobody) != 0))
+            ::_exit(1);
+        const replacement made = native_file_exchange().create_beside(target);
+        if (made.error != 0) ::_exit(2);
+        ::_exit(fs::status(made.path).permissions() == fs::perms(is_root ? 0666 : 0676) ? 0 : 3);
+    }
+    int status = 0;
+    ASSERT_EQ(::waitpid(child, &status, 0), child);
+    EXPECT_TRUE(WIFEXITED(status));
+    EXPECT_EQ(WEXITSTATUS(status), 0);
+}
+
 TEST_F(FileExchange, GivesANewFileWhatTheMaskLeaves) {
     const mode_t mask = ::umask(077);
     const replacement made = native_file_exchange().create_beside(folder / "a");
@@ -119,19 +157,26 @@ TEST_F(FileExchange, GivesANewFileWhatTheMaskLeaves) {
     native_file_descriptors().close(made.descriptor);
 }
 
-TEST_F(FileExchange, FollowsLinksAndReplacesOneThatLeadsNowhere) {
+TEST_F(FileExchange, FollowsLinksAlsoToAFileThatIsNotThereYet) {
     write("a", "old");
     fs::create_symlink("a", folder / "b");
     fs::create_symlink("b", folder / "c");
-    fs::create_symlink("nowhere", folder / "d");
+    fs::create_directory(folder / "sub");
+    fs::create_symlink("../nowhere", folder / "sub" / "link");
+    fs::create_symlink("sub/link", folder / "d");
     fs::create_symlink("e", folder / "e");
+    fs::create_symlink("none/a", folder / "f");
     const replacement followed = native_file_exchange().create_beside(folder / "c");
     EXPECT_EQ(followed.target, fs::canonical(folder) / "a");
     native_file_descriptors().close(followed.descriptor);
     const replacement dangling = native_file_exchange().create_beside(folder / "d");
-    EXPECT_EQ(dangling.target, folder / "d");
     EXPECT_EQ(dangling.error, 0);
-    native_file_descriptors().close(dangling.descriptor);
+    fill(dangling, "new");
+    EXPECT_EQ(native_file_exchange().replace(dangling.path, dangling.target), 0);
+    EXPECT_EQ(read(folder / "nowhere"), "new");
+    EXPECT_TRUE(fs::is_symlink(folder / "d"));
+    EXPECT_TRUE(fs::is_symlink(folder / "sub" / "link"));
+    EXPECT_EQ(native_file_exchange().create_beside(folder / "f").error, ENOENT);
     EXPECT_EQ(native_file_exchange().create_beside(folder / "e").error, ELOOP);
 }
 

@@ -124,12 +124,14 @@ TEST(LoadDocument, TakesTheFirstEntryAndNoOther) {
 }
 
 TEST(LoadDocument, ReadsAPipe) {
-    int ends[2];
-    ASSERT_EQ(::pipe(ends), 0);
-    ASSERT_EQ(::write(ends[1], k_text.data(), k_text.size()), static_cast<ssize_t>(k_text.size()));
-    ::close(ends[1]);
-    EXPECT_TRUE(is_the_document(load_document("/dev/fd/" + std::to_string(ends[0]))));
-    ::close(ends[0]);
+    for (const std::string& bytes : {k_text, packed(k_text).Build()}) {
+        int ends[2];
+        ASSERT_EQ(::pipe(ends), 0);
+        ASSERT_EQ(::write(ends[1], bytes.data(), bytes.size()), static_cast<ssize_t>(bytes.size()));
+        ::close(ends[1]);
+        EXPECT_TRUE(is_the_document(load_document("/dev/fd/" + std::to_string(ends[0]))));
+        ::close(ends[0]);
+    }
 }
 
 // Files that cannot be read --------------------------------------------------------------------------------
@@ -200,6 +202,56 @@ TEST(LoadDocument, ReportsAStreamThatFailsOnTheWay) {
         EXPECT_EQ(result.code, qbxV2::EQBX_USER_ERROR_3);
         EXPECT_TRUE(contains(result.message, "the cable was pulled")) << result.message;
     }
+}
+
+/// Throws what is no std::exception.
+class careless_buffer : public std::streambuf {
+protected:
+    int_type underflow() override { throw 7; }
+};
+
+TEST(LoadDocument, ReportsAStreamThatThrowsAnything) {
+    careless_buffer buffer;
+    std::istream stream(&buffer);
+    EXPECT_EQ(load_document(stream).failure, file_failure::system_error);
+}
+
+/// The beginning of an archive, and then zeros for ever.
+class endless_buffer : public std::streambuf {
+protected:
+    std::streamsize xsgetn(char* out, std::streamsize count) override {
+        std::fill_n(out, count, '\0');
+        if (!m_begun) std::copy_n("PK\3\4", 4, out);
+        m_begun = true;
+        return count;
+    }
+
+private:
+    bool m_begun = false;
+};
+
+TEST(LoadDocument, TakesNoMoreOfAPackedStreamThanItsTextMayHave) {
+    endless_buffer buffer;
+    std::istream stream(&buffer);
+    load_options options;
+    options.max_unpacked_size = 1000000;
+    const load_result result = load_document(stream, options);
+    EXPECT_EQ(result.failure, file_failure::limit_exceeded);
+    EXPECT_EQ(result.code, qbxV2::EQBX_USER_ERROR_4);
+    EXPECT_TRUE(contains(result.message, "more than 1000000 bytes")) << result.message;
+}
+
+TEST(LoadDocument, CanBeCancelledWhileAPackedStreamIsTakenIn) {
+    endless_buffer buffer;
+    std::istream stream(&buffer);
+    int asked = 0;
+    load_options options;
+    options.progress = [&](std::uint64_t done, std::uint64_t) {
+        EXPECT_EQ(done, 0u);
+        return ++asked < 5;
+    };
+    EXPECT_EQ(load_document(stream, options).failure, file_failure::cancelled);
+    EXPECT_EQ(asked, 5);
 }
 
 // Documents that are not valid -----------------------------------------------------------------------------
@@ -408,8 +460,17 @@ TEST(LoadDocument, LimitsTheExpansionOfEntities) {
     load_options options;
     options.max_entity_expansion = 100000;
     const load_result result = load_document_from_memory(text, options);
+    EXPECT_EQ(result.failure, file_failure::limit_exceeded);
     EXPECT_EQ(result.code, qbxV2::EQBX_ELEMENT_VALUE_UNREADABLE);
     EXPECT_EQ(result.document, nullptr);
+    EXPECT_TRUE(contains(result.message, "entities expand to more than 100000 bytes")) << result.message;
+}
+
+TEST(LoadDocument, TellsAnEntityThatContainsItselfFromOneThatIsTooLarge) {
+    std::string text = "<!DOCTYPE Vrl:Vrl [<!ENTITY a \"&a;\">]>" + vrl_test::document();
+    text.replace(text.find("maker"), 5, "&a;");
+    const load_result result = load_document_from_memory(text);
+    EXPECT_EQ(result.failure, file_failure::bad_document);
     EXPECT_TRUE(contains(result.message, "(Badly formed DTD)")) << result.message;
 }
 
@@ -501,6 +562,21 @@ const lie k_lies[] = {
      },
      "damaged"},
     {"StreamCutOff", [](RawArchive& a) { first(a).data.resize(first(a).data.size() - 20); }, "ends after"},
+    {"StreamShorterThanDeclared", [](RawArchive& a) { first(a).data += "more"; }, "in 4 bytes less"},
+    {"StreamMuchShorterThanDeclared", [](RawArchive& a) { first(a).data += std::string(500000, '!'); },
+     "in 500000 bytes less"},
+    {"Bzip2ShorterThanDeclared",
+     [](RawArchive& a) {
+         first(a) = RawEntry::Bzip2Entry("a", k_text);
+         first(a).data += std::string(500000, '!');
+     },
+     "in 500000 bytes less"},
+    {"StoredLonger",
+     [](RawArchive& a) {
+         first(a) = RawEntry::Stored("a", k_text);
+         first(a).data += "more";
+     },
+     "in 4 bytes less"},
     {"StreamDamaged", [](RawArchive& a) { first(a).data[0] = '\7'; }, "compressed data is damaged"},
     {"Bzip2Damaged",
      [](RawArchive& a) {

@@ -284,6 +284,25 @@ TEST(SaveDocument, KeepsTheModeAndTheLinksOfTheTarget) {
     EXPECT_EQ(fs::status(folder.Path() / "real.vrl").permissions(), fs::perms(0640));
 }
 
+TEST(SaveDocument, MakesWhatALinkLeadsToAndLeavesTheLink) {
+    const ScratchFolder folder;
+    fs::create_directory(folder.Path() / "other");
+    fs::create_symlink("other/real.vrl", folder.Path() / "link.vrl");
+    ASSERT_TRUE(save_document(document_of(1), folder / "link.vrl"));
+    EXPECT_TRUE(fs::is_symlink(folder.Path() / "link.vrl"));
+    EXPECT_TRUE(load_document(folder.Path() / "other" / "real.vrl"));
+    EXPECT_EQ(folder.Names().size(), 2u);
+}
+
+TEST(SaveDocument, LeavesOtherHardLinksTheOldFile) {
+    const ScratchFolder folder;
+    folder.Write("a.vrl", "old");
+    fs::create_hard_link(folder.Path() / "a.vrl", folder.Path() / "b.vrl");
+    ASSERT_TRUE(save_document(document_of(1), folder / "a.vrl"));
+    EXPECT_TRUE(load_document(folder / "a.vrl"));
+    EXPECT_EQ(folder.Read("b.vrl"), "old");
+}
+
 TEST(SaveDocument, GivesANewFileTheModeThatTheProcessGives) {
     const ScratchFolder folder;
     const mode_t mask = ::umask(027);
@@ -343,12 +362,16 @@ TEST(SaveDocument, ReplacesNoFolderAndNoDevice) {
 class common_user {
 public:
     common_user() {
-        if (m_root) EXPECT_EQ(::seteuid(65534), 0);
+        if (m_root) {
+            EXPECT_EQ(::seteuid(65534), 0);
+        }
     }
     common_user(const common_user&) = delete;
     common_user& operator=(const common_user&) = delete;
     ~common_user() {
-        if (m_root) EXPECT_EQ(::seteuid(0), 0);
+        if (m_root) {
+            EXPECT_EQ(::seteuid(0), 0);
+        }
     }
 
 private:
@@ -508,6 +531,25 @@ TEST(SaveDocument, ReportsAStreamThatTakesNoMore) {
             EXPECT_EQ(result.code, qbxV2::EQBX_USER_ERROR_3);
             EXPECT_NE(result.message, "");
         }
+    }
+}
+
+/// Throws what is no std::exception.
+class careless_buffer : public std::streambuf {
+protected:
+    std::streamsize xsputn(const char* /*text*/, std::streamsize /*length*/) override { throw 7; }
+    int_type overflow(int_type /*c*/) override { throw 7; }
+};
+
+TEST(SaveDocument, ReportsAStreamThatThrowsAnything) {
+    const Vrl document = document_of(500);
+    for (const file_format format : {file_format::plain, file_format::packed}) {
+        careless_buffer buffer;
+        std::ostream stream(&buffer);
+        stream.exceptions(std::ios_base::badbit);
+        save_options options;
+        options.format = format;
+        EXPECT_EQ(save_document(document, stream, options).failure, file_failure::system_error);
     }
 }
 

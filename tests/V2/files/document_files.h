@@ -59,12 +59,12 @@ public:
         refused.error = create_error;
         return refused;
     }
-    int replace(const std::filesystem::path& from, const std::filesystem::path& to) override {
+    int replace(const std::filesystem::path& from, const std::filesystem::path& to) noexcept override {
         return replace_error != 0 ? replace_error : m_native.replace(from, to);
     }
-    int remove(const std::filesystem::path& path) override { return m_native.remove(path); }
-    int commit_folder(const std::filesystem::path& path) override {
-        return folder_error != 0 ? folder_error : m_native.commit_folder(path);
+    int remove(const std::filesystem::path& path) noexcept override { return m_native.remove(path); }
+    int commit_folder(const std::filesystem::path& folder) noexcept override {
+        return folder_error != 0 ? folder_error : m_native.commit_folder(folder);
     }
 
 private:
