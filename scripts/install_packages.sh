@@ -8,11 +8,11 @@ packages_of() {
     case $1 in
         # What a configuration with default options looks for, the framework of the tests included.
         build) echo g++ cmake ninja-build ccache pkg-config libxml2-dev zlib1g-dev libbz2-dev nettle-dev libgtest-dev ;;
-        demo) echo libxml2-utils ;;
+        demo) echo libxml2-utils unzip ;;
         # Judges from outside: of documents, of archives, of the managed layer.
         test) echo libxml2-utils zip unzip p7zip-full python3 mono-mcs mono-runtime ;;
         # The peers that the benchmarks run beside.
-        bench) echo libexpat1-dev libpugixml-dev xsdcxx libxerces-c-dev ;;
+        bench) echo libexpat1-dev libpugixml-dev xsdcxx libxerces-c-dev libzip-dev libminizip-dev ;;
         fuzz) echo clang libclang-rt-dev llvm ;;
         lint) echo clang clang-format clang-tidy ;;
         coverage) echo lcov ;;

@@ -1,0 +1,13 @@
+cmake_minimum_required(VERSION 3.25)
+# Saves a document plain, packs it, and unpacks it twice: with the program itself and with another one.
+file(REMOVE_RECURSE ${VRL_WORK})
+file(MAKE_DIRECTORY ${VRL_WORK})
+function(run)
+    execute_process(COMMAND ${ARGN} WORKING_DIRECTORY ${VRL_WORK} COMMAND_ERROR_IS_FATAL ANY)
+endfunction()
+run(${VRL_CONVERT} ${VRL_DOCUMENT} plain.vrl)
+run(${VRL_CONVERT} ${VRL_DOCUMENT} packed.vrlz)
+run(${VRL_CONVERT} packed.vrlz unpacked.vrl)
+run(${CMAKE_COMMAND} -E compare_files plain.vrl unpacked.vrl)
+run(unzip -q packed.vrlz -d by_unzip)
+run(${CMAKE_COMMAND} -E compare_files plain.vrl by_unzip/packed.vrl)
