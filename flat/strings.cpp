@@ -44,26 +44,18 @@ char* allocate(std::size_t length) {
     return text;
 }
 
-bool is_beyond_one_unit(wchar_t c) { return static_cast<std::uint32_t>(c) > 0xFFFF; }
-
-/// The units that a wide string becomes: an element above 0xFFFF is a pair.
-std::size_t unit_count(const std::wstring& text) {
-    std::size_t count = text.size();
-    for (const wchar_t c : text) count += is_beyond_one_unit(c) ? 1U : 0U;
-    return count;
+/// Room for `count` units of UTF-16.
+char16_t* allocate_units(std::size_t count) {
+    return reinterpret_cast<char16_t*>(allocate(count * sizeof(char16_t)));
 }
 
-}  // namespace
+bool is_beyond_one_unit(wchar_t c) { return static_cast<std::uint32_t>(c) > 0xFFFF; }
 
-char16_t* new_text(const std::wstring& text) {
-    const std::size_t count = unit_count(text);
-    auto* const made = reinterpret_cast<char16_t*>(allocate(count * sizeof(char16_t)));
+/// The text with a pair of units for an element above 0xFFFF.
+char16_t* new_text_with_pairs(const std::wstring& text) {
+    const auto pairs = std::count_if(text.begin(), text.end(), is_beyond_one_unit);
+    char16_t* const made = allocate_units(text.size() + static_cast<std::size_t>(pairs));
     if (made == nullptr) return nullptr;
-    // Almost every text is of single units: a loop without a branch, which the compiler does in blocks.
-    if (count == text.size()) {
-        std::transform(text.begin(), text.end(), made, [](wchar_t c) { return static_cast<char16_t>(c); });
-        return made;
-    }
     char16_t* to = made;
     for (const wchar_t c : text) {
         const auto code = static_cast<std::uint32_t>(c);
@@ -75,6 +67,24 @@ char16_t* new_text(const std::wstring& text) {
         }
     }
     return made;
+}
+
+}  // namespace
+
+char16_t* new_text(const std::wstring& text) {
+    char16_t* const made = allocate_units(text.size());
+    if (made == nullptr) return nullptr;
+    // The model's own texts are of single units: one pass without a branch, which is done in blocks.
+    const wchar_t* const from = text.data();
+    const std::size_t size = text.size();
+    std::uint32_t bits = 0;
+    for (std::size_t i = 0; i < size; ++i) {
+        bits |= static_cast<std::uint32_t>(from[i]);
+        made[i] = static_cast<char16_t>(from[i]);
+    }
+    if (bits <= 0xFFFF) return made;
+    vrl_free_string(made);
+    return new_text_with_pairs(text);
 }
 
 char* new_text(const std::string& bytes) {

@@ -1,6 +1,9 @@
 #include <array>
+#include <cstdint>
+#include <cstring>
 #include <string>
 
+#include "V2/Vrl.h"
 #include "tests/flat/flat_driver.h"
 #include "tests/flat/reported_null.h"
 
@@ -254,6 +257,20 @@ TEST_F(FlatValues, IncludeTwoThatCanOnlyBeMade) {
     // No function frees it: remembered, so that no leak is seen.
     static void* const base = CSharp_new_c_datetime_base();
     EXPECT_NE(base, nullptr);
+}
+
+TEST_F(FlatValues, GiveAPairForAnElementBeyondSixteenBits) {
+    // The model's texts hold units; a caller in C++ may leave whole characters in them.
+    vrl_v2::Header header;
+    header.set_Creator(
+        L"a\x1D11E"
+        L"b");
+    char16_t* const text = CSharp_Header_get_Creator(&header);
+    std::uint32_t bytes = 0;
+    std::memcpy(&bytes, reinterpret_cast<const char*>(text) - sizeof bytes, sizeof bytes);
+    EXPECT_EQ(std::u16string(text, bytes / sizeof(char16_t)), u"a\U0001D11Eb");
+    EXPECT_EQ(text[4], 0);
+    vrl_free_string(text);
 }
 
 TEST_F(FlatValues, PassHalfAPairThroughAsItIs) {
