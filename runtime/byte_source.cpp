@@ -39,7 +39,7 @@ bool c_read_memory::fill_run() { return m_run.next != m_run.end; }
 c_read_file::c_read_file(std::FILE* file) : m_file(file), m_buffer_size(k_block) {}
 
 c_read_file::c_read_file(const char* path)
-    : m_source_id(path), m_file(std::fopen(path, "rb")), m_buffer_size(k_read_ahead) {}
+    : m_source_id(path), m_file(vrl_platform::open_file(path, "rb")), m_buffer_size(k_read_ahead) {}
 
 c_read_file::c_read_file(const wchar_t* path)
     : m_source_id(source_id_of(path)),

@@ -173,6 +173,7 @@ TEST(LoadFile, NeedsTheFile) {
     EXPECT_EQ(document.loadFile(folder.wide_path(L"missing")), 1);
     EXPECT_EQ(document.loadFile(folder.wide_path(L"missing.VRLZ")), 1);
     EXPECT_EQ(document.loadFile(L""), 1);
+    EXPECT_EQ(document.loadFile(folder.wide_path(L"")), 1) << "a folder is no file";
 }
 
 TEST(LoadFile, FindsThatAnArchiveUnderAPlainNameIsNoDocument) {

@@ -91,6 +91,8 @@ TEST(Document, ThatIsNotThereIsNotOpened) {
     EXPECT_EQ(error, 1);
     const ColorSpaceCMYK space("/nonexistent/a.vrl", &error);
     EXPECT_EQ(error, 1);
+    const vrl_test::temporary_folder folder;
+    EXPECT_EQ(document.unmarshal(folder.path("").c_str()), 1) << "a folder is no file";
 }
 
 TEST(Document, ThatIsEmptyEndsUnexpectedly) {

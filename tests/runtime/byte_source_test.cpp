@@ -114,6 +114,13 @@ TEST(ReadFile, AMissingPathIsNotOpenAndGivesTheEndWithoutAReport) {
     EXPECT_EQ(source.read(), -1);
 }
 
+TEST(ReadFile, AFolderIsNoFile) {
+    const TemporaryFile file("x");
+    const std::string folder = file.folder();
+    EXPECT_FALSE(c_read_file(folder.c_str()).is_open());
+    EXPECT_FALSE(c_read_file(std::wstring(folder.begin(), folder.end()).c_str()).is_open());
+}
+
 TEST(ReadFile, ANullStreamIsNotOpen) {
     c_read_file source(static_cast<std::FILE*>(nullptr));
     EXPECT_FALSE(source.is_open());
