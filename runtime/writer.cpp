@@ -6,12 +6,16 @@
 #include <typeinfo>
 
 #include "runtime/namespaces.h"
+#include "runtime/stream_state.h"
 
 namespace qbxV2 {
 namespace {
 
 /// Large enough that the stream is called seldom, small enough to stay in the cache.
 constexpr std::size_t k_gathered_at_once = 32 * 1024;
+
+/// A stream's default, and that of the seconds of dates that are gathered.
+constexpr std::streamsize k_gathered_precision = 6;
 
 // Namespaces in XML: XML Schema Part 1, 2.6.
 constexpr const char k_schema_instance_uri[] = "http://www.w3.org/2001/XMLSchema-instance";
@@ -103,14 +107,12 @@ void c_xml_writer::conditionally_select_ns_map(const s_ns_map* map) {
     if (m_map == nullptr) m_map = map;
 }
 
-void c_xml_writer::write_namespace(const char* prefix, const char* uri) {
+void c_xml_writer::write_namespace(std::string_view prefix, std::string_view uri) {
     put(" xmlns");
-    if (*prefix != '\0') {
-        put(":");
-        put(prefix);
-    }
+    if (!prefix.empty()) put(":");
+    put(prefix.data(), prefix.size());
     put("=\"");
-    put(uri);
+    put(uri.data(), uri.size());
     put("\"");
 }
 
@@ -119,7 +121,7 @@ void c_xml_writer::conditionally_write_ns_attrs(bool include_xsi) {
     if (m_map != nullptr) {
         for (const s_ns_map* row = m_map; row->uri != nullptr; ++row) write_namespace(row->prefix, row->uri);
     }
-    for (const auto& extra : m_extra_namespaces) write_namespace(extra.first.c_str(), extra.second.c_str());
+    for (const auto& extra : m_extra_namespaces) write_namespace(extra.first, extra.second);
     if (include_xsi || !m_schema_locations.empty()) write_namespace("xsi", k_schema_instance_uri);
     write_schema_locations();
     m_ns_attrs_written = true;
@@ -131,15 +133,16 @@ void c_xml_writer::write_schema_locations() {
     if (m_schema_locations.front().first.empty()) {
         // Intended: a first entry without namespace speaks for the whole document; the others are ignored.
         put(" xsi:noNamespaceSchemaLocation=\"");
-        put(m_schema_locations.front().second.c_str());
+        const std::string& location = m_schema_locations.front().second;
+        put(location.data(), location.size());
     } else {
         put(" xsi:schemaLocation=\"");
         const char* separator = "";
-        for (const auto& entry : m_schema_locations) {
+        for (const auto& [ns, location] : m_schema_locations) {
             put(separator);
-            put(entry.first.c_str());
+            put(ns.data(), ns.size());
             put(" ");
-            put(entry.second.c_str());
+            put(location.data(), location.size());
             separator = " ";
         }
     }
@@ -176,7 +179,8 @@ bool c_xml_writer::get_error_info(eqbx_error_type* type, eqbx_error* error, int*
 
 void c_xml_writer::open_element() {
     if (m_open_elements++ == 0) {
-        m_gathering = typeid(*this) == typeid(c_xml_writer) && stream_formats_plainly();
+        m_gathering = typeid(*this) == typeid(c_xml_writer) && detail::prints_plainly(m_os) &&
+                      m_os.precision() == k_gathered_precision;
     }
 }
 
@@ -233,13 +237,6 @@ void c_xml_writer::put_through() {
         m_os.fill('0');
         m_zero_fill = false;
     }
-}
-
-bool c_xml_writer::stream_formats_plainly() const {
-    constexpr auto shaping = std::ios_base::floatfield | std::ios_base::basefield |
-                             std::ios_base::adjustfield | std::ios_base::uppercase | std::ios_base::showpos |
-                             std::ios_base::showpoint | std::ios_base::showbase | std::ios_base::boolalpha;
-    return (m_os.flags() & shaping) == std::ios_base::dec && m_os.width() == 0 && m_os.precision() == 6;
 }
 
 }  // namespace qbxV2

@@ -3,6 +3,7 @@
 #include <cstddef>
 #include <iosfwd>
 #include <string>
+#include <string_view>
 #include <utility>
 #include <vector>
 
@@ -112,10 +113,9 @@ private:
     using pair_list = std::vector<std::pair<std::string, std::string>>;
 
     void write_declaration(int flags);
-    void write_namespace(const char* prefix, const char* uri);
+    void write_namespace(std::string_view prefix, std::string_view uri);
     void write_schema_locations();
     void put_through();
-    bool stream_formats_plainly() const;
 
     std::ostream& m_os;
     int m_level = 0;

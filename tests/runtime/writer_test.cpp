@@ -10,6 +10,7 @@
 #include <vector>
 
 #include "runtime/namespaces.h"
+#include "tests/runtime/writer_trial.h"
 
 namespace {
 
@@ -17,8 +18,10 @@ using qbxV2::c_xml_writer;
 using qbxV2::eqbx_error;
 using qbxV2::eqbx_error_type;
 using qbxV2::s_ns_map;
+using vrl_test::asking_writer;
+using vrl_test::k_map;
+using vrl_test::trial;
 
-constexpr s_ns_map k_map[] = {{1000, "a", "urn:a"}, {0, nullptr, nullptr}};
 constexpr s_ns_map k_other_map[] = {{1000, "b", "urn:b"}, {0, nullptr, nullptr}};
 constexpr s_ns_map k_long_map[] = {{1000, "a", "urn:a"},
                                    {1001, "", "urn:default"},
@@ -26,19 +29,6 @@ constexpr s_ns_map k_long_map[] = {{1000, "a", "urn:a"},
                                    {0, "d", nullptr},
                                    {5, "e", "urn:e"}};
 const std::string k_xsi = " xmlns:xsi=\"http://www.w3.org/2001/XMLSchema-instance\"";
-
-/// A writer on a text of its own.
-struct trial {
-    std::ostringstream os;
-    c_xml_writer out{os, "\t", "\n"};
-
-    trial() { out.conditionally_select_ns_map(k_map); }
-    std::string attributes(bool include_xsi = true) {
-        os.str("");
-        out.conditionally_write_ns_attrs(include_xsi);
-        return os.str();
-    }
-};
 
 TEST(WriterDeclaration, FollowsTheFlags) {
     const std::string start = "<?xml version=\"1.0\" encoding=\"UTF-8\"";
@@ -119,20 +109,6 @@ TEST(WriterLineEnd, IsGivenAndNotWritten) {
     EXPECT_STREQ(out.endl(), "NL");
     EXPECT_EQ(os.str(), "");
 }
-
-class asking_writer : public c_xml_writer {
-public:
-    explicit asking_writer(std::ostream& os) : c_xml_writer(os, "\t", "\n"), m_stream(os) {}
-    void nest() override { m_stream << "."; }
-    const char* endl() override {
-        ++ends;
-        return "|";
-    }
-    int ends = 0;
-
-private:
-    std::ostream& m_stream;
-};
 
 TEST(Writer, AsksASubclassForIndentAndLineEnd) {
     std::ostringstream os;
@@ -230,6 +206,19 @@ TEST(NamespaceAttributes, AreNotEscaped) {
     t.out.add_schema_location("urn:a&b", "a.xsd?x&y");
     EXPECT_EQ(t.attributes(), " xmlns:a=\"urn:a\" xmlns:x=\"urn:x?a=1&b=<2>'\"" + k_xsi +
                                   " xsi:schemaLocation=\"urn:a&b a.xsd?x&y\"");
+}
+
+TEST(NamespaceAttributes, KeepAZeroByteThatACallerPutIn) {
+    const std::string zero(1, '\0');
+    trial t;
+    t.out.add_namespace("x" + zero + "y", "urn:" + zero + "x");
+    t.out.add_schema_location("urn:" + zero, zero + "a.xsd");
+    EXPECT_EQ(t.attributes(), " xmlns:a=\"urn:a\" xmlns:x" + zero + "y=\"urn:" + zero + "x\"" + k_xsi +
+                                  " xsi:schemaLocation=\"urn:" + zero + " " + zero + "a.xsd\"");
+    trial alone;
+    alone.out.add_no_namespace_schema_location("a" + zero + "b");
+    EXPECT_EQ(alone.attributes(),
+              " xmlns:a=\"urn:a\"" + k_xsi + " xsi:noNamespaceSchemaLocation=\"a" + zero + "b\"");
 }
 
 TEST(NamespacePrefix, IsTheMapsBeforeAnAddedOne) {
@@ -389,104 +378,6 @@ TEST(Writer, WritesNothingAtItsEnd) {
         out(false) << "<open>";
     }
     EXPECT_EQ(os.str(), "<open>");
-}
-
-TEST(WriterGathering, LetsTheStreamBeUsedInBetween) {
-    trial t;
-    t.out.open_element();
-    t.out.put("a");
-    t.out(false) << "b";
-    t.out.put("c", 1);
-    t.out.indent();
-    t.out.put_indent();
-    t.out.nest();
-    t.out.put_line_end();
-    t.out.close_element();
-    EXPECT_EQ(t.os.str(), "abc\t\t\n") << "pieces come out in the order in which they went in";
-}
-
-TEST(WriterGathering, EndsWithTheOutermostElement) {
-    trial t;
-    t.out.open_element();
-    t.out.open_element();
-    t.out.put("x");
-    t.out.close_element();
-    t.out.put("y");
-    t.out.close_element();
-    EXPECT_FALSE(t.out.is_gathering());
-    EXPECT_EQ(t.os.str(), "xy");
-    t.out.put("z");
-    EXPECT_EQ(t.os.str(), "xyz");
-}
-
-TEST(WriterGathering, KeepsNoMoreThanABufferful) {
-    trial t;
-    t.out.open_element();
-    const std::string piece(1000, 'x');
-    for (int i = 0; i < 100; ++i) t.out.put(piece.data(), piece.size());
-    EXPECT_GT(t.os.str().size(), 50000u);
-    t.out.close_element();
-    EXPECT_EQ(t.os.str(), std::string(100000, 'x'));
-}
-
-TEST(WriterGathering, IsLeftToASubclassToRefuse) {
-    std::ostringstream os;
-    asking_writer out(os);
-    out.open_element();
-    EXPECT_FALSE(out.is_gathering()) << "it waits to be asked";
-    out.indent();
-    out.put_indent();
-    out.put("x");
-    out.put_line_end();
-    out.close_element();
-    EXPECT_EQ(os.str(), ".x|");
-}
-
-/// Fails once, then takes everything.
-class failing_once : public std::stringbuf {
-protected:
-    std::streamsize xsputn(const char* text, std::streamsize length) override {
-        return std::exchange(m_fails, false) ? 0 : std::stringbuf::xsputn(text, length);
-    }
-
-private:
-    bool m_fails = true;
-};
-
-TEST(WriterGathering, HandsNothingOverTwiceToAStreamThatThrows) {
-    failing_once buffer;
-    std::ostream os(&buffer);
-    os.exceptions(std::ios_base::badbit);
-    c_xml_writer out(os, "\t", "\n");
-    out.open_element();
-    out.put("a");
-    EXPECT_THROW(out.close_element(), std::ios_base::failure);
-    EXPECT_FALSE(out.is_gathering());
-    os.clear();
-    out.open_element();
-    out.put("b");
-    out.close_element();
-    EXPECT_EQ(buffer.str(), "b");
-}
-
-TEST(WriterGathering, IsAbandonedWithoutASecondException) {
-    failing_once buffer;
-    std::ostream os(&buffer);
-    os.exceptions(std::ios_base::badbit);
-    c_xml_writer out(os, "\t", "\n");
-    out.open_element();
-    out.open_element();
-    out.put("a");
-    out.abandon_element();
-    EXPECT_TRUE(out.is_gathering()) << "the outer one is open";
-    out.abandon_element();
-    EXPECT_FALSE(out.is_gathering());
-    EXPECT_EQ(buffer.str(), "");
-    os.clear();
-    out.open_element();
-    out.put("b");
-    out.abandon_element();
-    EXPECT_EQ(buffer.str(), "b") << "what waits goes out where it can";
 }
 
 }  // namespace
