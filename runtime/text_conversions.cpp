@@ -1,5 +1,6 @@
 #include "runtime/text_conversions.h"
 
+#include <algorithm>
 #include <cstdint>
 
 #include "runtime/utf16_units.h"
@@ -80,6 +81,20 @@ std::size_t put_units_from(wchar_t* units, const char* in, std::size_t size, std
     return static_cast<std::size_t>(units - start);
 }
 
+constexpr std::size_t k_widened_at_once = 2048;
+
+/// Widens everything in one loop without a way out, which compilers turn into vector code, and says
+/// afterwards whether that was right.
+bool widen_ascii(wchar_t* units, const char* in, std::size_t size) {
+    unsigned char all = 0;
+    for (std::size_t i = 0; i < size; ++i) {
+        const auto byte = static_cast<unsigned char>(in[i]);
+        all |= byte;
+        units[i] = static_cast<wchar_t>(byte);
+    }
+    return all < 0x80;
+}
+
 }  // namespace
 
 double float_zero() { return 0.0; }
@@ -106,20 +121,21 @@ std::wstring& vtostring(std::wstring& out, const std::string& in) {
 }
 
 std::wstring& vtostring(std::wstring& out, const char* in, std::size_t size) {
-    out.resize(size);
-    wchar_t* const units = out.data();
-    // Most texts are ASCII: widen everything in one loop without a way out, which compilers turn into vector
-    // code, and look afterwards whether that was right.
-    unsigned char all = 0;
-    for (std::size_t i = 0; i < size; ++i) {
-        const auto byte = static_cast<unsigned char>(in[i]);
-        all |= byte;
-        units[i] = static_cast<wchar_t>(byte);
+    out.clear();
+    out.reserve(size);
+    // Most texts are ASCII, and are widened piece by piece: what `resize` fills in is still in the cache when
+    // it is written over.
+    for (std::size_t at = 0; at < size;) {
+        const std::size_t piece = std::min(size - at, k_widened_at_once);
+        out.resize(at + piece);
+        if (!widen_ascii(out.data() + at, in + at, piece)) {
+            while (static_cast<unsigned char>(in[at]) < 0x80) ++at;
+            out.resize(size);
+            out.resize(at + put_units_from(out.data() + at, in, size, at));
+            break;
+        }
+        at += piece;
     }
-    if (all < 0x80) return out;
-    std::size_t plain = 0;
-    while (static_cast<unsigned char>(in[plain]) < 0x80) ++plain;
-    out.resize(plain + put_units_from(units + plain, in, size, plain));
     return out;
 }
 

@@ -11,6 +11,13 @@ using detail::byte_is;
 using detail::is_name_char;
 using detail::is_space;
 
+namespace {
+
+/// From here on a text gets the memory for its rest at once: growing by doubling touches three times as much.
+constexpr std::size_t k_long_text = 64 * 1024;
+
+}  // namespace
+
 void c_get_for_xml::rewind() {
     set_ws_mode(EQBX_WS_PRESERVE);
     c_get_with_entities::rewind();
@@ -284,10 +291,20 @@ void c_get_for_xml::collapse(std::string* s, const char* from, const char* to) {
     }
 }
 
+void c_get_for_xml::make_room_up_to_tag(std::string* s, const s_byte_run& run) {
+    const auto left = static_cast<std::size_t>(run.end - run.next);
+    const void* const tag = std::memchr(run.next, '<', left);
+    const auto more =
+        tag == nullptr ? left : static_cast<std::size_t>(static_cast<const unsigned char*>(tag) - run.next);
+    s->reserve(s->size() + more);
+}
+
 void c_get_for_xml::add_text_run(std::string* s, bool stop_at_ampersand) {
     s_byte_run run;
     if (!open_run(&run)) return;
     const detail::s_scan scan = detail::scan_text(run.next, run.end, !stop_at_ampersand, run_may_hold_utf8());
+    if (s->size() >= k_long_text && s->capacity() - s->size() < static_cast<std::size_t>(scan.end - run.next))
+        make_room_up_to_tag(s, run);
     add_chars_wsp(s, reinterpret_cast<const char*>(run.next), reinterpret_cast<const char*>(scan.end));
     take_run(scan.end, scan.line_feeds);
 }

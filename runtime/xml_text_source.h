@@ -93,6 +93,7 @@ private:
     bool read_standalone(int* c);
     pseudo_value read_pseudo_value(int* c, const char* rest_of_name, std::string* value);
     void add_run(std::string* s, unsigned char stop);
+    void make_room_up_to_tag(std::string* s, const s_byte_run& run);
     void collapse(std::string* s, const char* from, const char* to);
 
     eqbx_whitespace m_ws_mode = EQBX_WS_PRESERVE;

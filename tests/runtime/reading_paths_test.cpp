@@ -275,6 +275,33 @@ TEST_P(MutatedDocuments, GiveTheSameValuesOnEveryPathWithAnyPushBack) {
 
 INSTANTIATE_TEST_SUITE_P(Seeds, MutatedDocuments, testing::Range(0U, 16U));
 
+TEST(ReadingPaths, AgreeOnLongTextsThatGrowAndShrinkOnTheWay) {
+    const std::string line = "A text that is long and has\tmarks in it\r\n";
+    std::string plain;
+    while (plain.size() < 70000) plain += line;
+    const std::string grown = "&long;";
+    const std::string document =
+        join({"<!DOCTYPE a [<!ENTITY long '", std::string(5000, 'l'), "'>]><a>", plain, grown, grown,
+              "<!-- between -->", plain, "<![CDATA[ <&> ]]>", grown, plain, "&lt;&amp;", plain, "</a>"});
+    for (const eqbx_whitespace mode : {EQBX_WS_PRESERVE, EQBX_WS_REPLACE, EQBX_WS_COLLAPSE}) {
+        const std::string value = on_all_paths(document, [mode](c_read& source, bool use_runs) {
+            std::string log;
+            RecordingErrors errors(&log);
+            c_xml xml(source, errors, false);
+            xml.use_runs(use_runs);
+            c_xml_local scope;
+            std::string text;
+            bool is_empty = false;
+            xml.get_element_name(&scope, &text);
+            xml.skip_start_tag(&is_empty);
+            xml.get_element_value(&text, mode, true);
+            return log + text;
+        });
+        EXPECT_GT(value.size(), 4 * 60000U + 3 * 5000U);
+        EXPECT_NE(value.find(" <&> "), std::string::npos);
+    }
+}
+
 TEST(ReadingPaths, AgreeOnEveryDocumentCutAtEveryByte) {
     for (const std::string& document : documents()) {
         for (std::size_t size = 0; size <= document.size(); ++size) {

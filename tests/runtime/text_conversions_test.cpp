@@ -197,6 +197,22 @@ TEST(VToStringWide, FastAndDefinedWayAgreeOnRandomText) {
     }
 }
 
+TEST(VToStringWide, GivesLongTextsTheSameWherePiecesMeet) {
+    // Long texts are converted piece by piece; what is not ASCII may stand on either side of each seam, or
+    // across it.
+    for (const char* const piece :
+         {"", "x", "\xC3\xA9", "\xF0\x9F\x98\x80", "\xED\xA0\xBD\xED\xB8\x80", "\x80"}) {
+        for (std::size_t before = 2040; before <= 2056; ++before) {
+            for (const std::size_t start : {before, before + 2048}) {
+                const std::string text = std::string(start, 'a') + piece + std::string(3000, 'b');
+                ASSERT_EQ(wide(text), wide_by_steps(text))
+                    << testing::PrintToString(piece) << " at " << start;
+                ASSERT_EQ(wide(text.substr(0, start)), std::wstring(start, L'a'));
+            }
+        }
+    }
+}
+
 TEST(ConvertToUtf8, TakesBackWhatVToStringGave) {
     for (std::uint32_t code = 1; code < 0x110000; code += 7) {
         if (code >= 0xD800 && code < 0xE000) continue;
