@@ -18,6 +18,7 @@
 
 #include "bench/child.h"
 #include "bench/contender.h"
+#include "bench/flat_calls.h"
 #include "bench/machine.h"
 #include "bench/race.h"
 #include "bench/table.h"
@@ -116,6 +117,7 @@ int measure_everything(const std::string& folder) {
     }
     measure_extremes(folder, results);
     measure_library_loading(results);
+    measure_flat_calls(results);
     measure_unit_costs(spectral, brief, results);
 
     print_machine(std::cout);
