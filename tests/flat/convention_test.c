@@ -207,8 +207,18 @@ static void wildcard_texts_do_not_come_back(void) {
     char value[] = "untouched";
     CSharp_Revision_get_any(revision, 0, "", "", value);
     EXPECT(strcmp(value, "untouched") == 0);
+    CSharp_Revision_get_any(revision, 0, NULL, "", value);
+    EXPECT(message_is("null string"));
     CSharp_Revision_get_any(revision, 0, "", NULL, value);
     EXPECT(message_is("null string"));
+    CSharp_Revision_get_any(NULL, 0, "", "", NULL);
+    EXPECT(message_is("null string"));
+    CSharp_Revision_get_any(NULL, 0, "", "", value);
+    EXPECT(message_is("vrl_v2::Revision & type is null"));
+    EXPECT(CSharp_Revision_append_any(NULL, "<a/>") == 0);
+    EXPECT(message_is("vrl_v2::Revision & type is null"));
+    EXPECT(CSharp_Revision_insert_any(NULL, 0, "<a/>") == 0);
+    EXPECT(message_is("vrl_v2::Revision & type is null"));
     EXPECT(bytes_are(vrl_revision_any(revision, 0, 2), "<b/>"));
     EXPECT(bytes_are(vrl_revision_any(revision, 1, 2), "<a/>"));
     EXPECT(vrl_revision_any(revision, 2, 2) == NULL);
@@ -226,7 +236,21 @@ static void documents_come_and_go(void) {
     EXPECT(wide_is(CSharp_XMLDocumentResult_getXmlDocument(result), u"", 0));
     CSharp_delete_XMLDocumentResult(result);
     EXPECT(CSharp_Vrl_writeFile(document, u"somewhere.txt") == 1001);
+    EXPECT(CSharp_Vrl_writeFile(document, NULL) == 1001);
+    EXPECT(CSharp_Vrl_loadString(document, NULL) == CSharp_Vrl_loadString(document, u""));
+    EXPECT(g_message[0] == '\0');
     CSharp_delete_Vrl(document);
+    CSharp_delete_Vrl(NULL);
+    EXPECT(g_message[0] == '\0');
+
+    EXPECT(CSharp_Vrl_loadFile(NULL, u"unused.vrl") == 0);
+    EXPECT(message_is("vrl_v2::Vrl & type is null"));
+    EXPECT(CSharp_Vrl_loadString(NULL, u"<a/>") == 0);
+    EXPECT(message_is("vrl_v2::Vrl & type is null"));
+    EXPECT(CSharp_Vrl_writeFile(NULL, u"unused.vrl") == 0);
+    EXPECT(message_is("vrl_v2::Vrl & type is null"));
+    EXPECT(CSharp_Vrl_writeString(NULL) == NULL);
+    EXPECT(message_is("vrl_v2::Vrl & type is null"));
 
     void* made = CSharp_new_XMLDocumentResult(u"text", 7);
     EXPECT(wide_is(CSharp_XMLDocumentResult_getXmlDocument(made), u"text", 4));
