@@ -21,7 +21,7 @@ findings=build-fuzz/findings
 mkdir -p "$findings"
 failed=0
 report=()
-for target in scanner document load_save_load; do
+for target in scanner document load_save_load packed_load archive; do
     # What this machine found before comes first: new inputs are written there, never among the seeds.
     grown=build-fuzz/corpus/$target
     mkdir -p "$grown"

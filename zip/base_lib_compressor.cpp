@@ -20,7 +20,8 @@ void* CBaseLibCompressor::GetOpaque() { return TracksAllocations() ? this : null
 
 void* CBaseLibCompressor::AllocateFor(void* opaque, std::size_t items, std::size_t size) {
     if (size != 0 && items > SIZE_MAX / size) return nullptr;
-    void* block = std::malloc(items * size);
+    // A block of nothing may be null, which the libraries take for a failure.
+    void* block = std::malloc(std::max<std::size_t>(items * size, 1));
     if (opaque == nullptr || block == nullptr) return block;
     try {
         static_cast<CBaseLibCompressor*>(opaque)->m_allocations.push_back(block);
