@@ -72,7 +72,8 @@ private:
 
     /// A handler that forgives every error of a tag that has no end must not keep reading it for ever.
     bool is_at_end_of_input() {
-        if (m_reader.get_current_event() != qbxV2::EQXP_END_OF_MESSAGE && !m_reader.is_tag_cut()) return false;
+        if (m_reader.get_current_event() != qbxV2::EQXP_END_OF_MESSAGE && !m_reader.is_tag_cut())
+            return false;
         stop(qbxV2::EQBX_UNEXPECTED_END);
         return true;
     }
