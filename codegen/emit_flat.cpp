@@ -57,6 +57,8 @@ std::string emit_flat_header(const plan& model) {
 
 #include "flat/vrl_flat_base.h"
 
+/* The names are what callers bind to, their double underscores included. */
+/* NOLINTBEGIN(bugprone-reserved-identifier) */
 #ifdef __cplusplus
 extern "C" {
 #endif
@@ -64,7 +66,7 @@ extern "C" {
     for (const flat_group& group : flat_functions_of_values())
         declare_functions(out, group.subject, group.functions);
     for (const class_plan& made : model.classes) declare_functions(out, made.name, flat_functions_of(made));
-    out.print("\n#ifdef __cplusplus\n}\n#endif\n\n#endif\n");
+    out.print("\n#ifdef __cplusplus\n}\n#endif\n/* NOLINTEND(bugprone-reserved-identifier) */\n\n#endif\n");
     return out.text();
 }
 
