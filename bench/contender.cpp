@@ -2,6 +2,8 @@
 
 #include <stdexcept>
 
+#include "bench/packing.h"
+
 namespace bench {
 
 void need_elements(std::size_t elements, const document& input) {
@@ -28,8 +30,11 @@ const std::vector<entry>& contenders() {
 }
 
 const entry& find_contender(const std::string& name) {
-    for (const entry& one : contenders()) {
-        if (name == one.name) return one;
+    for (const std::vector<entry>* const all :
+         {&contenders(), &packing_contenders(), &unpacking_contenders()}) {
+        for (const entry& one : *all) {
+            if (name == one.name) return one;
+        }
     }
     throw std::invalid_argument("no contender is called " + name);
 }

@@ -49,10 +49,10 @@ std::unique_ptr<contender> pugixml_save();
 std::unique_ptr<contender> xsdcxx_parse();
 std::unique_ptr<contender> xsdcxx_serialise();
 
-/// All of them, in the order of the table.
+/// All of them, in the order of the table. Those that pack stand in bench/packing.h.
 const std::vector<entry>& contenders();
 
-/// The contender of that name. Throws std::invalid_argument if there is none.
+/// The contender of that name, of either list. Throws std::invalid_argument if there is none.
 const entry& find_contender(const std::string& name);
 
 }  // namespace bench

@@ -4,6 +4,8 @@
 #include <libxml/xmlversion.h>
 #include <sys/utsname.h>
 #include <unistd.h>
+#include <zip.h>
+#include <zlib.h>
 
 #include <fstream>
 #include <pugixml.hpp>
@@ -36,7 +38,8 @@ void print_machine(std::ostream& os) {
        << "- Compiler: " << VRL_BENCH_COMPILER << "\n"
        << "- Peers: " << XML_ExpatVersion() << ", libxml2 " << LIBXML_DOTTED_VERSION << ", pugixml "
        << PUGIXML_VERSION / 1000 << '.' << PUGIXML_VERSION / 10 % 100 << ", CodeSynthesis XSD "
-       << XSD_STR_VERSION << " on Xerces-C++ " << XERCES_FULLVERSIONDOT << "\n";
+       << XSD_STR_VERSION << " on Xerces-C++ " << XERCES_FULLVERSIONDOT << ", zlib " << zlibVersion()
+       << ", libzip " << zip_libzip_version() << ", minizip\n";
 }
 
 }  // namespace bench

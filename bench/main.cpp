@@ -20,6 +20,7 @@
 #include "bench/contender.h"
 #include "bench/flat_calls.h"
 #include "bench/machine.h"
+#include "bench/packing.h"
 #include "bench/race.h"
 #include "bench/table.h"
 #include "bench/unit_costs.h"
@@ -29,6 +30,8 @@ namespace {
 
 constexpr int k_rounds = 9;
 constexpr int k_growth_rounds = 3;
+// One takes milliseconds.
+constexpr int k_rounds_of_unpacking = 45;
 constexpr double k_growth = 1.15;
 constexpr std::size_t k_mb = 1000000;
 
@@ -43,7 +46,7 @@ target speed_goal(const std::string& task) {
 }
 
 void measure_speed(const document& input, table& results) {
-    const std::vector<standing> standings = race(input, k_rounds);
+    const std::vector<standing> standings = race(contenders(), input, k_rounds);
     const double measure = standings.front().rate;
     for (const standing& one : standings) {
         results.add_rate(input.name, one.name, one.rate, one.rate / measure, speed_goal(one.name));
@@ -108,12 +111,17 @@ int measure_everything(const std::string& folder) {
     const document brief = make_short_palette(folder, "short records 10 MB", 10 * k_mb);
     measure_speed(spectral, results);
     measure_speed(brief, results);
+    measure_packing(spectral, k_rounds, results);
+    measure_unpacking(spectral, k_rounds_of_unpacking, results);
     {
         const document small = make_spectral_palette(folder, "spectral 1 MB", k_mb);
         const document large = make_spectral_palette(folder, "spectral 100 MB", 100 * k_mb);
         measure_memory(large, results);
         measure_growth(small, large, k_load_memory, at_most(k_growth), results);
         measure_growth(small, large, k_write, at_most(k_growth), results);
+        measure_packing(large, k_rounds, results);
+        measure_unpacking(large, k_rounds, results);
+        measure_packing_memory(large, results);
     }
     measure_extremes(folder, results);
     measure_library_loading(results);

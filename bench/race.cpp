@@ -44,9 +44,9 @@ double processor_seconds() {
     return static_cast<double>(now.tv_sec) + static_cast<double>(now.tv_nsec) * 1e-9;
 }
 
-std::vector<standing> race(const document& input, int rounds) {
+std::vector<standing> race(const std::vector<entry>& entries, const document& input, int rounds) {
     std::vector<runner> runners;
-    for (const entry& one : contenders()) runners.push_back({one.name, one.make()});
+    for (const entry& one : entries) runners.push_back({one.name, one.make()});
     for (runner& one : runners) one.task->prepare(input);
     for (int round = 0; round < rounds; ++round) {
         for (runner& one : runners) one.best = std::min(one.best, pace(*one.task, input, 1));

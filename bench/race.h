@@ -25,9 +25,9 @@ struct standing {
     double rate;
 };
 
-/// All contenders on one document, `rounds` times in turn, so that what else the machine does meets all of
-/// them alike.
-std::vector<standing> race(const document& input, int rounds);
+/// Several contenders on one document, `rounds` times in turn, so that what else the machine does meets all
+/// of them alike.
+std::vector<standing> race(const std::vector<entry>& entries, const document& input, int rounds);
 
 /// Processor seconds a byte of `input` takes, by the best of `rounds`, each repeated up to `bytes` bytes, so
 /// that small documents are timed over as much work as large ones. To be asked in a process of its own: from

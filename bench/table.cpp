@@ -7,7 +7,7 @@
 namespace bench {
 namespace {
 
-const std::array<std::string, 6> k_head = {"document", "measured", "figure", "x expat", "target", "result"};
+const std::array<std::string, 6> k_head = {"document", "measured", "figure", "ratio", "target", "result"};
 constexpr std::size_t k_first_number = 2;  // From this column on, flush right.
 
 std::string text(double number, int digits) {
