@@ -117,7 +117,7 @@ struct [[nodiscard]] load_result : file_outcome {
 ///           and never held as a whole. Its CRC, its size and its local header must agree with the archive's
 ///           directory, and its stream must end where it says; otherwise there is no document, even if all of
 ///           it could be read.
-/// Memory    above the document's own some 0.5 MB, however large the file. A packed document that comes
+/// Memory    above the document's own below 1 MB, however large the file. A packed document that comes
 ///           through a pipe is held as it is packed, as from a stream.
 [[nodiscard]] VRL_API load_result load_document(const std::filesystem::path& path,
                                                 const load_options& options = {});
@@ -161,7 +161,7 @@ struct [[nodiscard]] save_result : file_outcome {};
 ///           one whose `WriteSDKInformation` is there and not complete. A write-protected target is not
 ///           replaced, nor is a folder or a device (not_opened). If only the flush of the folder fails, the
 ///           result says so, and the target is the new document.
-/// Memory    some 0.5 MB, however large the document; packing streams.
+/// Memory    below 1 MB, however large the document; packing streams.
 [[nodiscard]] VRL_API save_result save_document(const Vrl& document, const std::filesystem::path& path,
                                                 const save_options& options = {});
 /// To where the stream stands. Plain text has LF at line ends here, a packed file what it has on disk. On

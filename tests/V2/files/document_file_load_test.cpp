@@ -522,6 +522,17 @@ TEST(LoadDocument, LimitsTheUnpackedSize) {
         << "a plain file is its own size";
 }
 
+TEST(LoadDocument, RefusesAnArchiveBeyond32BitsByItsSize) {
+    const ScratchFolder folder;
+    folder.Write("a.vrlz", packed(k_text).Build());
+    // Only its size is that large: nothing is stored for what was never written.
+    std::filesystem::resize_file(folder.Path() / "a.vrlz", std::uintmax_t{5} << 30);
+    const load_result result = load_document(folder / "a.vrlz");
+    EXPECT_EQ(result.failure, file_failure::limit_exceeded);
+    EXPECT_EQ(result.code, qbxV2::EQBX_USER_ERROR_4);
+    EXPECT_TRUE(contains(result.message, "4 GB at most")) << result.message;
+}
+
 TEST(LoadDocument, RefusesADeclaredSizeWithoutAllocatingIt) {
     RawArchive archive = packed(k_text);
     archive.entries[0].uncompressed = 0xFFFFFFFF;
