@@ -1,9 +1,9 @@
 #include <memory>
-#include <sstream>
+#include <ostream>
 #include <string_view>
-#include <utility>
 
 #include "V2/Vrl.h"
+#include "V2/frame/text_blocks.h"
 #include "V2/library_stamp.h"
 #include "V2/packed_route.h"
 #include "platform/file_open.h"
@@ -72,12 +72,13 @@ eqbx_error Vrl::writeFile(std::wstring const& path) const {
 }
 
 XMLDocumentResult Vrl::writeString() const {
-    std::ostringstream os;
+    frame::text_blocks blocks;
+    std::ostream os(&blocks);
     // Memory that runs out would else end the text early, with no code to tell of it.
     os.exceptions(std::ios_base::badbit);
     const eqbx_error result = write_text(*this, os);
     std::wstring document;
-    if (result == qbxV2::EQBX_NO_ERROR) qbxV2::convert(&document, std::move(os).str());
+    if (result == qbxV2::EQBX_NO_ERROR) qbxV2::convert(&document, blocks.take());
     return {document, result};
 }
 

@@ -2,7 +2,9 @@
 
 #include <cstdio>
 #include <fstream>
-#include <sstream>
+#include <ostream>
+
+#include "V2/frame/text_blocks.h"
 
 namespace vrl_v2::frame {
 
@@ -12,11 +14,12 @@ eqbx_error marshal_to_stream(const document_element& element, std::ostream& os) 
 }
 
 eqbx_error marshal_to_string(const document_element& element, std::string* text) {
-    std::ostringstream os;
+    text_blocks blocks;
+    std::ostream os(&blocks);
     // Memory that runs out would else end the text early, with no code to tell of it.
     os.exceptions(std::ios_base::badbit);
     const eqbx_error result = marshal_to_stream(element, os);
-    if (result == qbxV2::EQBX_NO_ERROR) *text = std::move(os).str();
+    if (result == qbxV2::EQBX_NO_ERROR) *text = blocks.take();
     return result;
 }
 
