@@ -7,10 +7,10 @@
 #include <string_view>
 
 #include "platform/text_encoding.h"
+#include "platform/utf_characters.h"
 #include "runtime/binary.h"
 #include "runtime/number_text.h"
 #include "runtime/stream_state.h"
-#include "runtime/utf16_units.h"
 
 namespace qbxV2 {
 namespace {
@@ -53,7 +53,7 @@ bool is_plain(std::uint32_t code) { return code < k_plain_codes.size() && k_plai
 /// Appends the plain elements from `at` on and returns the place of the first other one.
 std::size_t append_plain_run(std::string& out, const wchar_t* text, std::size_t at, std::size_t size) {
     std::size_t end = at;
-    while (end != size && is_plain(detail::code_of(text[end]))) ++end;
+    while (end != size && is_plain(vrl_platform::code_of(text[end]))) ++end;
     const std::size_t before = out.size();
     out.resize(before + (end - at));
     for (char* to = out.data() + before; at != end; ++at) *to++ = static_cast<char>(text[at]);
@@ -112,7 +112,7 @@ std::ostream& operator<<(std::ostream& os, const c_as_xml<std::string>& text) {
 std::ostream& operator<<(std::ostream& os, const c_as_ascii<std::wstring>& text) {
     std::string out;
     for (const wchar_t element : text.get()) {
-        const auto code = detail::code_of(element);
+        const auto code = vrl_platform::code_of(element);
         if (code < 0x80) {
             out.push_back(static_cast<char>(code));
         } else {
@@ -143,17 +143,17 @@ void append_escaped(std::string& out, const std::wstring& text) {
     for (std::size_t at = 0; at < size;) {
         at = append_plain_run(out, text.data(), at, size);
         if (at == size) return;
-        auto code = detail::code_of(text[at++]);
-        if (detail::is_high_surrogate(code)) {
+        auto code = vrl_platform::code_of(text[at++]);
+        if (vrl_platform::is_high_surrogate(code)) {
             // Intended: a high surrogate without its partner ends the text, and no error is raised.
             if (at == size) return;
-            const auto low = detail::code_of(text[at++]);
-            if (!detail::is_low_surrogate(low)) return;
-            code = detail::from_surrogates(code, low);
+            const auto low = vrl_platform::code_of(text[at++]);
+            if (!vrl_platform::is_low_surrogate(low)) return;
+            code = vrl_platform::from_surrogates(code, low);
         }
         const std::string_view reference = reference_for(code);
         if (reference.empty()) {
-            detail::append_utf8(out, code);
+            vrl_platform::append_utf8(out, code);
         } else {
             out.append(reference);
         }

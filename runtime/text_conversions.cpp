@@ -3,15 +3,16 @@
 #include <algorithm>
 #include <cstdint>
 
-#include "runtime/utf16_units.h"
+#include "platform/utf_characters.h"
 
 namespace qbxV2 {
 
-using detail::append_utf8;
-using detail::code_of;
-using detail::from_surrogates;
-using detail::is_high_surrogate;
-using detail::is_low_surrogate;
+using vrl_platform::append_utf8;
+using vrl_platform::code_of;
+using vrl_platform::from_surrogates;
+using vrl_platform::is_high_surrogate;
+using vrl_platform::is_low_surrogate;
+using vrl_platform::read_utf8_sequence;
 
 namespace {
 
@@ -29,31 +30,6 @@ void append_utf8_from(std::string& out, const std::wstring& in, std::size_t at) 
     }
 }
 
-/// Bytes of the sequence that begins with `lead`, 0 if none does, and the payload bits of `lead`.
-std::size_t sequence_length(std::uint32_t lead, std::uint32_t& payload) {
-    payload = lead;
-    if (lead < 0x80) return 1;
-    payload = lead & 0x1F;
-    if ((lead & 0xE0) == 0xC0) return 2;
-    payload = lead & 0x0F;
-    if ((lead & 0xF0) == 0xE0) return 3;
-    payload = lead & 0x07;
-    if ((lead & 0xF8) == 0xF0) return 4;
-    return 0;
-}
-
-/// Reads the sequence at `at` into `code` and returns its length; 0 when there is none or it is broken.
-std::size_t read_sequence(const char* in, std::size_t size, std::size_t at, std::uint32_t& code) {
-    const std::size_t count = sequence_length(static_cast<unsigned char>(in[at]), code);
-    if (count == 0 || count > size - at) return 0;
-    for (std::size_t i = 1; i < count; ++i) {
-        const auto byte = static_cast<unsigned char>(in[at + i]);
-        if ((byte & 0xC0) != 0x80) return 0;
-        code = (code << 6) | (byte & 0x3FU);
-    }
-    return count;
-}
-
 /// Converts from the byte at `at` on into `units`, which has room for as many units as there are bytes.
 /// Returns the number of units.
 std::size_t put_units_from(wchar_t* units, const char* in, std::size_t size, std::size_t at) {
@@ -61,7 +37,7 @@ std::size_t put_units_from(wchar_t* units, const char* in, std::size_t size, std
     std::uint32_t pending = 0;
     while (at < size) {
         std::uint32_t code = 0;
-        const std::size_t count = read_sequence(in, size, at, code);
+        const std::size_t count = read_utf8_sequence(in, size, at, code);
         if (count == 0) break;
         at += count;
         if (pending != 0) {

@@ -1,36 +1,13 @@
 #include <gtest/gtest.h>
 
+#include "reader_on_text.h"
 #include "reading_paths.h"
-#include "runtime/reader.h"
 
 namespace {
 
 using namespace qbxV2;
+using reader_on_text::Reading;
 using reading_paths::join;
-
-constexpr s_ns_map k_ns_map[] = {{1000, "V", "doc"}, {0, nullptr, nullptr}};
-
-/// A reader on a text, with the namespaces of the document format.
-struct Reading {
-    explicit Reading(const std::string& document) : text(document), source(text), reader(source) {
-        reader.set_ns_map(k_ns_map);
-    }
-    /// Reads the next start tag, attributes and all.
-    void start_tag() {
-        reader.get_element_event(nullptr, &error, &name);
-        EXPECT_EQ(reader.get_current_event(), EQXP_NAME);
-        while (reader.get_attribute_event(nullptr, &error, &value)) reader.skip_attribute_value();
-    }
-    /// Reads the next element's name.
-    void element() { reader.get_element_event(nullptr, &error, &name); }
-
-    std::string text;
-    c_read_string source;
-    c_xml_reader reader;
-    eqbx_error error = EQBX_NO_ERROR;
-    std::string name;
-    std::string value;
-};
 
 class Recovering : public c_xml_reader {
 public:

@@ -1,10 +1,12 @@
 #pragma once
 
+#include <cstddef>
 #include <cstdint>
 #include <string>
 #include <type_traits>
 
-namespace qbxV2::detail {
+/// UTF-8 and UTF-16, a character at a time.
+namespace vrl_platform {
 
 /// The value of an element, whether `wchar_t` is signed or not.
 constexpr std::uint32_t code_of(wchar_t element) {
@@ -40,4 +42,29 @@ inline void append_utf8(std::string& out, std::uint32_t code) {
     }
 }
 
-}  // namespace qbxV2::detail
+/// Bytes of the sequence that begins with `lead`, 0 if none does, and the payload bits of `lead`.
+inline std::size_t utf8_sequence_length(std::uint32_t lead, std::uint32_t& payload) {
+    payload = lead;
+    if (lead < 0x80) return 1;
+    payload = lead & 0x1F;
+    if ((lead & 0xE0) == 0xC0) return 2;
+    payload = lead & 0x0F;
+    if ((lead & 0xF0) == 0xE0) return 3;
+    payload = lead & 0x07;
+    if ((lead & 0xF8) == 0xF0) return 4;
+    return 0;
+}
+
+/// Reads the sequence at `at` into `code` and returns its length; 0 when there is none or it is broken.
+inline std::size_t read_utf8_sequence(const char* in, std::size_t size, std::size_t at, std::uint32_t& code) {
+    const std::size_t count = utf8_sequence_length(static_cast<unsigned char>(in[at]), code);
+    if (count == 0 || count > size - at) return 0;
+    for (std::size_t i = 1; i < count; ++i) {
+        const auto byte = static_cast<unsigned char>(in[at + i]);
+        if ((byte & 0xC0) != 0x80) return 0;
+        code = (code << 6) | (byte & 0x3FU);
+    }
+    return count;
+}
+
+}  // namespace vrl_platform

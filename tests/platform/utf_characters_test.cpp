@@ -1,10 +1,10 @@
-#include "runtime/utf16_units.h"
+#include "platform/utf_characters.h"
 
 #include <gtest/gtest.h>
 
 namespace {
 
-using namespace qbxV2::detail;
+using namespace vrl_platform;
 
 TEST(Utf16Units, SurrogatesAreTwoRanges) {
     EXPECT_FALSE(is_high_surrogate(0xD7FF));
