@@ -1,6 +1,7 @@
 #include "V2/packed_route.h"
 
 #include "platform/file_open.h"
+#include "platform/utf_characters.h"
 #include "runtime/xml_reader.h"
 #include "zip/zip_archive.h"
 
@@ -25,10 +26,10 @@ std::string engine_path(const std::wstring& path) {
     };
     const auto take_unit = [&take](std::uint32_t unit) { return take(unit & 0xFF) && take(unit >> 8); };
     for (const wchar_t c : path) {
-        const auto code = static_cast<std::uint32_t>(c);
+        const std::uint32_t code = vrl_platform::code_of(c);
         const bool beyond_one_unit = code > 0xFFFF;
-        if (beyond_one_unit && !take_unit(0xD800 + ((code - 0x10000) >> 10))) return bytes;
-        if (!take_unit(beyond_one_unit ? 0xDC00 + (code & 0x3FF) : code)) return bytes;
+        if (beyond_one_unit && !take_unit(vrl_platform::high_surrogate_of(code))) return bytes;
+        if (!take_unit(beyond_one_unit ? vrl_platform::low_surrogate_of(code) : code)) return bytes;
     }
     return bytes;
 }

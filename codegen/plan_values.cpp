@@ -103,11 +103,9 @@ limits_plan plan_limits(const value_plan& value, const stored_form& form) {
         limits.kind = form.limits;
         limits.lowest = value.facet.min_inclusive.value_or(form.lowest);
         limits.highest = value.facet.max_inclusive.value_or(form.highest);
-    } else if (form.limits == limits_plan::form::range && value.facet.has_range()) {
-        limits.kind = form.limits;
     } else if (value.is_enumerated() && !form.collapsed_text) {
         limits.kind = limits_plan::form::literals;
-    } else if (form.limits == limits_plan::form::length && value.facet.has_length()) {
+    } else if (form.limits == limits_plan::form::range ? value.facet.has_range() : value.facet.has_length()) {
         limits.kind = form.limits;
     }
     return limits;

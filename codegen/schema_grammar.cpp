@@ -119,7 +119,9 @@ void check_attributes(const xmlNode* node, const names& known) {
     for (const xmlAttr* found = node->properties; found != nullptr; found = found->next) {
         const std::string name = reinterpret_cast<const char*>(found->name);
         if (found->ns != nullptr || known.count(name) == 0) {
-            throw schema_error(node, "unknown attribute " + name + " of " + local_name(node));
+            const std::string owner = local_name(node);
+            throw schema_error(node,
+                               std::string("unknown attribute ").append(name).append(" of ").append(owner));
         }
         const auto values = known_values().find(name);
         const std::string value = attribute(node, name.c_str());

@@ -8,6 +8,7 @@
 
 #include "flat/vrl_flat_base.h"
 #include "platform/loaded_symbols.h"
+#include "platform/utf_characters.h"
 
 namespace vrl_flat {
 namespace {
@@ -49,7 +50,7 @@ char16_t* allocate_units(std::size_t count) {
     return reinterpret_cast<char16_t*>(allocate(count * sizeof(char16_t)));
 }
 
-bool is_beyond_one_unit(wchar_t c) { return static_cast<std::uint32_t>(c) > 0xFFFF; }
+bool is_beyond_one_unit(wchar_t c) { return vrl_platform::code_of(c) > 0xFFFF; }
 
 /// The text with a pair of units for an element above 0xFFFF.
 char16_t* new_text_with_pairs(const std::wstring& text) {
@@ -58,10 +59,10 @@ char16_t* new_text_with_pairs(const std::wstring& text) {
     if (made == nullptr) return nullptr;
     char16_t* to = made;
     for (const wchar_t c : text) {
-        const auto code = static_cast<std::uint32_t>(c);
+        const std::uint32_t code = vrl_platform::code_of(c);
         if (is_beyond_one_unit(c)) {
-            *to++ = static_cast<char16_t>(0xD800 + ((code - 0x10000) >> 10));
-            *to++ = static_cast<char16_t>(0xDC00 + (code & 0x3FF));
+            *to++ = static_cast<char16_t>(vrl_platform::high_surrogate_of(code));
+            *to++ = static_cast<char16_t>(vrl_platform::low_surrogate_of(code));
         } else {
             *to++ = static_cast<char16_t>(code);
         }
@@ -89,7 +90,7 @@ char16_t* new_text(const std::wstring& text) {
 
 char* new_text(const std::string& bytes) {
     char* const made = allocate(bytes.size());
-    if (made != nullptr) std::memcpy(made, bytes.data(), bytes.size());
+    if (made != nullptr) std::copy(bytes.begin(), bytes.end(), made);
     return made;
 }
 
@@ -103,7 +104,8 @@ std::wstring wide(const char16_t* text) {
 extern "C" {
 
 void vrl_free_string(void* text) {
-    if (text != nullptr) std::free(static_cast<char*>(text) - vrl_flat::prefix());
+    // The block begins ahead of the text.
+    if (text != nullptr) std::free(static_cast<char*>(text) - vrl_flat::prefix());  // NOLINT(*-unix.Malloc)
 }
 
 void vrl_set_string_prefix(int32_t bytes) {

@@ -29,8 +29,8 @@ std::wstring wide_from_code_page(const std::string& text) {
         if (length == 0) return out;
         i += length;
         if (code > 0xFFFF) {
-            out.push_back(static_cast<wchar_t>(0xD800 + ((code - 0x10000) >> 10)));
-            out.push_back(static_cast<wchar_t>(0xDC00 + (code & 0x3FF)));
+            out.push_back(static_cast<wchar_t>(high_surrogate_of(code)));
+            out.push_back(static_cast<wchar_t>(low_surrogate_of(code)));
         } else {
             out.push_back(static_cast<wchar_t>(code));
         }

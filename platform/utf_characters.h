@@ -21,6 +21,10 @@ constexpr std::uint32_t from_surrogates(std::uint32_t high, std::uint32_t low) {
     return 0x10000 + ((high - 0xD800) << 10) + (low - 0xDC00);
 }
 
+/// The two surrogates of a character above 16 bits.
+constexpr std::uint32_t high_surrogate_of(std::uint32_t code) { return 0xD800 + ((code - 0x10000) >> 10); }
+constexpr std::uint32_t low_surrogate_of(std::uint32_t code) { return 0xDC00 + (code & 0x3FF); }
+
 /// Appends `code` as UTF-8 (RFC 3629, section 3). A surrogate is encoded like any other value; above 21 bits
 /// the rest is cut off.
 inline void append_utf8(std::string& out, std::uint32_t code) {

@@ -10,8 +10,10 @@ namespace qbxV2 {
 using vrl_platform::append_utf8;
 using vrl_platform::code_of;
 using vrl_platform::from_surrogates;
+using vrl_platform::high_surrogate_of;
 using vrl_platform::is_high_surrogate;
 using vrl_platform::is_low_surrogate;
+using vrl_platform::low_surrogate_of;
 using vrl_platform::read_utf8_sequence;
 
 namespace {
@@ -48,8 +50,8 @@ std::size_t put_units_from(wchar_t* units, const char* in, std::size_t size, std
         } else if (is_high_surrogate(code)) {
             pending = code;
         } else if (code > 0xFFFF) {
-            *units++ = static_cast<wchar_t>(0xD800 + ((code - 0x10000) >> 10));
-            *units++ = static_cast<wchar_t>(0xDC00 + (code & 0x3FF));
+            *units++ = static_cast<wchar_t>(high_surrogate_of(code));
+            *units++ = static_cast<wchar_t>(low_surrogate_of(code));
         } else {
             *units++ = static_cast<wchar_t>(code);
         }
