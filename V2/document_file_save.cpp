@@ -1,4 +1,4 @@
-#include <cstring>
+#include <algorithm>
 #include <ostream>
 #include <utility>
 
@@ -69,7 +69,7 @@ void add_unicode_path(CZipExtraField& extra, const std::string& ascii, const std
     out[0] = k_version;
     ZipArchiveLib::StoreNumber32(
         out + 1, static_cast<std::uint32_t>(crc32(0, bytes, static_cast<uInt>(ascii.size()))));
-    std::memcpy(out + k_head, name.data(), name.size());
+    std::copy(name.begin(), name.end(), out + k_head);
 }
 
 /// Names are stored in a code page that few have; so what is not ASCII stands beside them in UTF-8.

@@ -4,7 +4,7 @@
 
 namespace qbxV2 {
 
-void c_cracked_name::set(const c_xml_local* scope, const std::string& name) {
+void c_cracked_name::set(c_xml_local* scope, const std::string& name) {
     m_full_name = name;
     const char* const begin = m_full_name.data();
     const void* const colon = std::memchr(begin, ':', m_full_name.size());

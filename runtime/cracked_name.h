@@ -15,10 +15,10 @@ namespace qbxV2 {
 class VRL_API c_cracked_name {
 public:
     c_cracked_name() = default;
-    c_cracked_name(const c_xml_local* scope, const std::string& name) { set(scope, name); }
+    c_cracked_name(c_xml_local* scope, const std::string& name) { set(scope, name); }
 
     /// Cuts up `name`; its prefix, or the default namespace, is looked up from `scope`.
-    void set(const c_xml_local* scope, const std::string& name);
+    void set(c_xml_local* scope, const std::string& name);
 
     const std::string& get_full_name() const { return m_full_name; }
     bool get_has_ns_prefix() const { return m_has_prefix; }

@@ -64,7 +64,7 @@ char* unicode_char_to_utf8(int code, char* buffer) {
     return buffer;
 }
 
-bool utf8_to_unicode_char(const char* s, int* code) {
+bool utf8_to_unicode_char(char* s, int* code) {
     const unsigned lead = static_cast<unsigned char>(*s);
     const int length = length_from_lead_byte(lead);
     if (length == 0) {

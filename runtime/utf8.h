@@ -19,7 +19,7 @@ VRL_API char* unicode_char_to_utf8(int code, char* buffer);
 /// Decodes one character of one to four bytes. False with `*code` -1 for a byte that leads no sequence; false
 /// with
 /// `*code` partly built where a continuation byte is missing. Overlong forms pass.
-VRL_API bool utf8_to_unicode_char(const char* s, int* code);
+VRL_API bool utf8_to_unicode_char(char* s, int* code);
 
 /// Exchanges `n` bytes of two buffers.
 VRL_API void bswap(void* a, void* b, std::size_t n);

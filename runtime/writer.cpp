@@ -173,7 +173,7 @@ eqbx_error c_xml_writer::handle_error(eqbx_error error, const std::string& item_
     return m_last_error;
 }
 
-bool c_xml_writer::get_error_info(eqbx_error_type* type, eqbx_error* error, int* line) const {
+bool c_xml_writer::get_error_info(eqbx_error_type* type, eqbx_error* error, int* line) {
     return m_error_sink.get_error_info(type, error, line);
 }
 

@@ -85,7 +85,7 @@ public:
     /// Records a failure found while marshalling; returns what `user_handle_error` makes of it.
     eqbx_error handle_error(eqbx_error error, const std::string& item_name, const char* file, int line);
     /// Reads the embedded `c_error`, which the writer itself never feeds: false after a marshalling error.
-    bool get_error_info(eqbx_error_type* type, eqbx_error* error, int* line) const;
+    bool get_error_info(eqbx_error_type* type, eqbx_error* error, int* line);
     const std::string& get_error_item_name() const { return m_item_name; }
 
     /// Gathers output while elements of the model are written, so that the stream is called once in a
