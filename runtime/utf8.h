@@ -16,9 +16,8 @@ VRL_API bool is_valid_utf8_char_sequence(const char* s);
 /// `buffer`. No range check; a surrogate is encoded like any other value.
 VRL_API char* unicode_char_to_utf8(int code, char* buffer);
 
-/// Decodes one character of one to four bytes. False with `*code` -1 for a byte that leads no sequence; false
-/// with
-/// `*code` partly built where a continuation byte is missing. Overlong forms pass.
+/// Decodes one character of one to four bytes; `s` is only read. False with `*code` -1 for a byte that leads
+/// no sequence; false with `*code` partly built where a continuation byte is missing. Overlong forms pass.
 VRL_API bool utf8_to_unicode_char(char* s, int* code);
 
 /// Exchanges `n` bytes of two buffers.

@@ -73,24 +73,24 @@ TEST(UnicodeCharToUtf8, NulIsTheEmptyText) {
 }
 
 TEST(Utf8ToUnicodeChar, AByteThatLeadsNoSequenceGivesMinusOneAndFalse) {
-    for (const char* const bytes : {"\x80", "\xBF", "\xF8\x88\x80\x80\x80", "\xFF"}) {
+    for (std::string bytes : {"\x80", "\xBF", "\xF8\x88\x80\x80\x80", "\xFF"}) {
         int code = 0;
-        EXPECT_FALSE(utf8_to_unicode_char(bytes, &code));
+        EXPECT_FALSE(utf8_to_unicode_char(bytes.data(), &code));
         EXPECT_EQ(code, -1);
     }
 }
 
 TEST(Utf8ToUnicodeChar, AMissingContinuationGivesFalse) {
-    for (const char* const bytes :
-         {"\xC3", "\xC3x", "\xE2\x82", "\xE2\x82x", "\xF0\x9F\x98", "\xF0\x9F\x98x"}) {
+    for (std::string bytes : {"\xC3", "\xC3x", "\xE2\x82", "\xE2\x82x", "\xF0\x9F\x98", "\xF0\x9F\x98x"}) {
         int code = 0;
-        EXPECT_FALSE(utf8_to_unicode_char(bytes, &code)) << bytes;
+        EXPECT_FALSE(utf8_to_unicode_char(bytes.data(), &code)) << bytes;
     }
 }
 
 TEST(Utf8ToUnicodeChar, OverlongFormsPass) {
+    char bytes[] = "\xC0\xBC";
     int code = 0;
-    EXPECT_TRUE(utf8_to_unicode_char("\xC0\xBC", &code));
+    EXPECT_TRUE(utf8_to_unicode_char(bytes, &code));
     EXPECT_EQ(code, '<');
 }
 
