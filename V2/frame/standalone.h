@@ -40,7 +40,8 @@ eqbx_error unmarshal_document(T& self, qbxV2::c_xml_reader& reader, const char* 
     qbxV2::c_xml_reader_local scope(reader);
     const eqbx_error failed = find_document_element(reader, local_name, source, line);
     if (failed != qbxV2::EQBX_NO_ERROR) return failed;
-    return self.unmarshal(reader, reader.element_name_buffer());
+    // Parsing constructors come here, too, and mean their own class's function.
+    return self.unmarshal(reader, reader.element_name_buffer());  // NOLINT(*.VirtualCall)
 }
 
 template <class T>
