@@ -7,7 +7,6 @@
 namespace {
 
 using namespace vrl_v2;
-using vrl_test::complete;
 
 TEST(NewDocument, HasPreambleAndHeaderPresentWithTheReadingLibrary) {
     const Vrl document;

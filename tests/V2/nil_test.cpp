@@ -23,12 +23,12 @@ const std::string k_nil = " xsi:nil=\"true\"";
 template <class T>
 class Nillable : public testing::Test {};
 
-#define NILLABLE(type)                                                 \
-    struct of_##type {                                                 \
-        using object = type;                                           \
-        static constexpr const char* name = #type;                     \
-        static void set_nil(type& t) { t.setnil_##type(); }            \
-        static bool is_nil(const type& t) { return t.isnil_##type(); } \
+#define NILLABLE(type)                                                   \
+    struct of_##type {                                                   \
+        using object = type;                                             \
+        static constexpr const char* name = #type;                       \
+        static void set_nil(object& t) { t.setnil_##type(); }            \
+        static bool is_nil(const object& t) { return t.isnil_##type(); } \
     }
 
 NILLABLE(Density);

@@ -15,7 +15,7 @@ using reading_paths::on_all_paths;
 using reading_paths::printable;
 using reading_paths::Random;
 using reading_paths::RecordingErrors;
-using std::string_literals::operator""s;
+using namespace std::string_literals;
 
 const std::vector<std::string>& documents() {
     static const std::vector<std::string> k_documents = {

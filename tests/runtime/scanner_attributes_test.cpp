@@ -9,7 +9,7 @@ namespace {
 using namespace qbxV2;
 using scan_trace::attribute;
 using scan_trace::events;
-using std::string_literals::operator""s;
+using namespace std::string_literals;
 
 constexpr char k_fatal_quote[] = " !0/23@1: Schema is not Well Formed (expected '\"' or ''', got ";
 

@@ -10,7 +10,7 @@ namespace {
 using namespace qbxV2;
 using scan_trace::events;
 using scan_trace::value;
-using std::string_literals::operator""s;
+using namespace std::string_literals;
 
 struct Document {
     const char* why;

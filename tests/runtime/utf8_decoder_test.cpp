@@ -11,7 +11,7 @@ using reading_paths::join;
 using reading_paths::on_all_paths;
 using reading_paths::printable;
 using reading_paths::RecordingErrors;
-using std::string_literals::operator""s;
+using namespace std::string_literals;
 
 /// All values of an input up to the first -1, as text, with the line at the end and the reports. Continues
 /// behind the -1 for `more` values.

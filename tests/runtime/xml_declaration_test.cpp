@@ -5,7 +5,7 @@
 namespace {
 
 using scan_trace::events;
-using std::string_literals::operator""s;
+using namespace std::string_literals;
 
 struct Declaration {
     const char* why;
