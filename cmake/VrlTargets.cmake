@@ -27,5 +27,10 @@ function(vrl_add_tests program)
     # Built once and run once: what the optimiser would gain in a test, its own work would lose.
     target_compile_options(${program} PRIVATE $<$<CXX_COMPILER_ID:GNU,Clang>:-O0>)
     target_precompile_headers(${program} REUSE_FROM vrl_test_headers)
-    gtest_discover_tests(${program} DISCOVERY_TIMEOUT 60)
+    if(VRL_COVERAGE)
+        # In one process: each writes the counters of all sources when it ends.
+        add_test(NAME ${program} COMMAND ${program} --gtest_brief=1)
+    else()
+        gtest_discover_tests(${program} DISCOVERY_TIMEOUT 60)
+    endif()
 endfunction()

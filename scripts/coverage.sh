@@ -20,7 +20,12 @@ genhtml --quiet --prefix "$root" --output-directory build-coverage/html "$trace"
 
 awk -v root="$root/" '
     /^SF:/ { file = substr($0, 4); sub(root, "", file); next }
-    /^DA:/ { split(substr($0, 4), line, ","); ++lines[file]; if (line[2] > 0) ++ran[file] }
+    # A line comes once for each instance of its template, and for each source that includes it.
+    /^DA:/ {
+        split(substr($0, 4), line, ",")
+        if (!known[file, line[1]]++) ++lines[file]
+        if (line[2] > 0 && !hit[file, line[1]]++) ++ran[file]
+    }
     END {
         for (f in lines) {
             folder = f; sub(/\/[^\/]*$/, "", folder)

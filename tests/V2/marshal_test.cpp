@@ -18,7 +18,6 @@ using namespace vrl_v2;
 using vrl_test::complete;
 using vrl_test::k_declaration;
 using vrl_test::k_namespaces;
-using vrl_test::write_element;
 using vrl_test::write_inner_element;
 
 const std::string k_minimal = k_declaration + "<Vrl:Vrl" + k_namespaces +

@@ -12,7 +12,6 @@ namespace {
 
 using namespace vrl_v2;
 using vrl_test::element;
-using vrl_test::empty_element;
 using vrl_test::forgive;
 using vrl_test::outermost;
 using vrl_test::preamble;

@@ -21,7 +21,6 @@ using vrl_codegen::facets;
 using vrl_codegen::global_element;
 using vrl_codegen::has_note;
 using vrl_codegen::schema;
-using vrl_codegen::simple_type;
 
 struct refused_schema {
     const char* why;

@@ -21,7 +21,7 @@ protected:
     CZipArchive archive{world.environment};
 
     std::string Source(const std::string& name) {
-        const std::string path = folder.Write(name, ReadData(name));
+        std::string path = folder.Write(name, ReadData(name));
         world.names.set_modification_time(path, world.clock.time);
         return path;
     }

@@ -26,7 +26,8 @@ protected:
     const Bytes text = zip_test::SampleText(150000);
     const Bytes noise = zip_test::Noise(150000);
 
-    void SetUp() override {
+    void SetUp() override { Prepare(); }
+    void Prepare() {
         folder.Write("in/text.xml", text);
         folder.Write("in/noise.bin", noise);
         folder.Write("in/empty", "");
@@ -85,7 +86,7 @@ protected:
 class OurArchive : public Interoperation, public testing::WithParamInterface<Way> {
 protected:
     void SetUp() override {
-        Interoperation::SetUp();
+        Prepare();
         Write("a.zip", CZipStorage::create, 0, GetParam());
     }
     bool IsAes() const { return GetParam().encryption > 0; }
@@ -130,7 +131,7 @@ INSTANTIATE_TEST_SUITE_P(Ways, OurArchive,
 class OurSegmentedArchive : public OurArchive {
 protected:
     void SetUp() override {
-        Interoperation::SetUp();
+        Prepare();
         Write("a.zip", CZipStorage::createSegmented, 40000, GetParam());
     }
 };
