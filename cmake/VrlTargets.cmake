@@ -16,6 +16,12 @@ function(vrl_add_room room)
     target_link_libraries(vrl_${room} PUBLIC ${ARG_PUBLIC} PRIVATE ${ARG_PRIVATE} vrl::warnings)
 endfunction()
 
+# Built once and run once: what the optimiser would gain in a test, its own work would lose.
+function(vrl_build_quickly program)
+    target_compile_options(${program} PRIVATE $<$<CXX_COMPILER_ID:GNU,Clang>:-O0>)
+    target_precompile_headers(${program} REUSE_FROM vrl_test_headers)
+endfunction()
+
 # vrl_add_tests(<program> SOURCES ... LIBRARIES ...): a GoogleTest program whose cases ctest knows one by one.
 function(vrl_add_tests program)
     cmake_parse_arguments(ARG "" "" "SOURCES;LIBRARIES" ${ARGN})
@@ -24,9 +30,7 @@ function(vrl_add_tests program)
     target_compile_features(${program} PRIVATE cxx_std_20)
     target_compile_definitions(${program} PRIVATE VRL_TEST_DATA="${PROJECT_SOURCE_DIR}/tests/data")
     target_link_libraries(${program} PRIVATE ${ARG_LIBRARIES} GTest::gtest_main vrl::warnings)
-    # Built once and run once: what the optimiser would gain in a test, its own work would lose.
-    target_compile_options(${program} PRIVATE $<$<CXX_COMPILER_ID:GNU,Clang>:-O0>)
-    target_precompile_headers(${program} REUSE_FROM vrl_test_headers)
+    vrl_build_quickly(${program})
     if(VRL_COVERAGE)
         # In one process: each writes the counters of all sources when it ends.
         add_test(NAME ${program} COMMAND ${program} --gtest_brief=1)
