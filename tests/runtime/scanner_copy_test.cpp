@@ -8,6 +8,7 @@ namespace {
 using namespace qbxV2;
 using reading_paths::join;
 using reading_paths::printable;
+using namespace std::string_literals;
 
 std::string copied(const std::string& document, eqbx_whitespace mode = EQBX_WS_PRESERVE) {
     return reading_paths::on_all_paths(document, [mode](c_read& source, bool use_runs) {
@@ -87,9 +88,8 @@ INSTANTIATE_TEST_SUITE_P(Broken, AnyElement,
                                               "false <a>"}));
 
 TEST(AnyElementNames, AreComparedBehindANulToo) {
-    const std::string whole("<a><b\0c>x</b\0c></a>", 21);
-    EXPECT_EQ(copied(whole), "true <a><b\\x00c>x</b\\x00c></a>");
-    EXPECT_EQ(copied(std::string("<a><b\0c></b\0d></a>", 20)), "false <a><b\\x00c>");
+    EXPECT_EQ(copied("<a><b\0c>x</b\0c></a>"s), "true <a><b\\x00c>x</b\\x00c></a>");
+    EXPECT_EQ(copied("<a><b\0c></b\0d></a>"s), "false <a><b\\x00c>");
 }
 
 TEST(AnyElementModes, ApplyToTextPieces) {
