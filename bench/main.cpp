@@ -29,7 +29,7 @@ namespace bench {
 namespace {
 
 constexpr int k_rounds = 9;
-constexpr int k_growth_rounds = 3;
+constexpr int k_growth_rounds = 7;
 // One takes milliseconds.
 constexpr int k_rounds_of_unpacking = 45;
 constexpr double k_growth = 1.15;
