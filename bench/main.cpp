@@ -12,8 +12,8 @@
 #include <exception>
 #include <fstream>
 #include <iostream>
-#include <limits>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include "bench/child.h"
@@ -47,9 +47,10 @@ target speed_goal(const std::string& task) {
 
 void measure_speed(const document& input, table& results) {
     const std::vector<standing> standings = race(contenders(), input, k_rounds);
-    const double measure = standings.front().rate;
+    const standing& measure = standings.front();
     for (const standing& one : standings) {
-        results.add_rate(input.name, one.name, one.rate, one.rate / measure, speed_goal(one.name));
+        results.add_rate(input.name, one.name, one.rate(), relative_time(measure, {&one}),
+                         speed_goal(one.name));
     }
 }
 
@@ -70,16 +71,16 @@ void measure_memory(const document& input, table& results) {
 void measure_growth(const document& small, const document& large, const char* task, target goal,
                     table& results) {
     const std::string bytes = std::to_string(large.bytes.size());
-    double small_pace = std::numeric_limits<double>::infinity();
-    double large_pace = small_pace;
+    const auto pace_of = [&](const document& input) {
+        return std::stod(output_of({own_path(), "--pace", task, input.path, bytes}));
+    };
+    std::vector<double> ratios;
     for (int round = 0; round < k_growth_rounds; ++round) {
-        small_pace =
-            std::min(small_pace, std::stod(output_of({own_path(), "--pace", task, small.path, bytes})));
-        large_pace =
-            std::min(large_pace, std::stod(output_of({own_path(), "--pace", task, large.path, bytes})));
+        const double small_pace = pace_of(small);
+        ratios.push_back(pace_of(large) / small_pace);
     }
     results.add_figure(large.name, std::string("time a byte against ") + small.name + ": " + task,
-                       large_pace / small_pace, "times", 2, goal);
+                       median(std::move(ratios)), "times", 2, goal);
 }
 
 void measure_extremes(const std::string& folder, table& results) {

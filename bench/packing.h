@@ -9,7 +9,7 @@
 namespace bench {
 
 /// The tasks on the way from a document to its packed file, and those on the way back, which find the packed
-/// file beside the document: see `make_packed`. The first of each is the measure of the others.
+/// file beside the document: see `make_packed`. Those that are held against each other stand side by side.
 const std::vector<entry>& packing_contenders();
 const std::vector<entry>& unpacking_contenders();
 

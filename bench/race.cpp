@@ -5,18 +5,12 @@
 
 #include <algorithm>
 #include <limits>
+#include <utility>
 
 namespace bench {
 namespace {
 
 constexpr double k_megabyte = 1e6;
-
-/// A contender on the track.
-struct runner {
-    std::string name;
-    std::unique_ptr<contender> task;
-    double best = std::numeric_limits<double>::infinity();  // seconds a byte
-};
 
 /// Seconds a byte over as many repetitions as reach `bytes`.
 double pace(contender& task, const document& input, std::size_t bytes) {
@@ -38,6 +32,24 @@ void keep_no_memory() {
 
 }  // namespace
 
+double standing::rate() const { return 1.0 / *std::min_element(paces.begin(), paces.end()) / k_megabyte; }
+
+double median(std::vector<double> figures) {
+    const auto middle = figures.begin() + static_cast<std::ptrdiff_t>(figures.size() / 2);
+    std::nth_element(figures.begin(), middle, figures.end());
+    return *middle;
+}
+
+double relative_time(const standing& one, const std::vector<const standing*>& others) {
+    std::vector<double> ratios;
+    for (std::size_t round = 0; round < one.paces.size(); ++round) {
+        double sum = 0.0;
+        for (const standing* const other : others) sum += other->paces[round];
+        ratios.push_back(one.paces[round] / sum);
+    }
+    return median(std::move(ratios));
+}
+
 double processor_seconds() {
     timespec now{};
     ::clock_gettime(CLOCK_THREAD_CPUTIME_ID, &now);
@@ -45,24 +57,26 @@ double processor_seconds() {
 }
 
 std::vector<standing> race(const std::vector<entry>& entries, const document& input, int rounds) {
-    std::vector<runner> runners;
-    for (const entry& one : entries) runners.push_back({one.name, one.make()});
-    for (runner& one : runners) one.task->prepare(input);
-    for (int round = 0; round < rounds; ++round) {
-        for (runner& one : runners) one.best = std::min(one.best, pace(*one.task, input, 1));
-    }
+    std::vector<std::unique_ptr<contender>> tasks;
     std::vector<standing> result;
-    result.reserve(runners.size());
-    for (const runner& one : runners) result.push_back({one.name, 1.0 / one.best / k_megabyte});
+    for (const entry& one : entries) {
+        tasks.push_back(one.make());
+        tasks.back()->prepare(input);
+        result.push_back({one.name, {}});
+    }
+    for (int round = 0; round < rounds; ++round) {
+        for (std::size_t i = 0; i < tasks.size(); ++i) result[i].paces.push_back(pace(*tasks[i], input, 1));
+    }
     return result;
 }
 
 double pace(const entry& task, const document& input, std::size_t bytes, int rounds) {
     keep_no_memory();
-    runner one{task.name, task.make()};
-    one.task->prepare(input);
-    for (int round = 0; round < rounds; ++round) one.best = std::min(one.best, pace(*one.task, input, bytes));
-    return one.best;
+    const std::unique_ptr<contender> one = task.make();
+    one->prepare(input);
+    double best = std::numeric_limits<double>::infinity();
+    for (int round = 0; round < rounds; ++round) best = std::min(best, pace(*one, input, bytes));
+    return best;
 }
 
 }  // namespace bench

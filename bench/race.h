@@ -19,11 +19,21 @@ double seconds(Task&& task) {
     return processor_seconds() - start;
 }
 
-/// How fast a contender was at its best, in megabytes (10^6 bytes) a second.
+/// How a contender did, round by round.
 struct standing {
     std::string name;
-    double rate;
+    std::vector<double> paces;  // seconds a byte
+
+    /// Megabytes (10^6 bytes) a second, by the best round.
+    double rate() const;
 };
+
+/// The middle one of `figures`, which are an odd number.
+double median(std::vector<double> figures);
+
+/// The times of `one` over those of all `others` together: the median of what each round gives. What ran side
+/// by side met the same machine; the best rounds of a short task and of a long one need not have.
+double relative_time(const standing& one, const std::vector<const standing*>& others);
 
 /// Several contenders on one document, `rounds` times in turn, so that what else the machine does meets all
 /// of them alike.
