@@ -100,6 +100,13 @@ void c_xml_reader::get_element_event(const s_event_map* first, const s_event_map
     if (m_event == EQXP_NAME) tokenise(first, last, EQXP_ELEMENT);
 }
 
+bool c_xml_reader::take_end_event(const std::string& name) {
+    if (!take_end_tag(name)) return false;
+    m_scope->clear();
+    m_event = EQXP_END_TAG;
+    return true;
+}
+
 bool c_xml_reader::get_attribute_event(const s_event_map map[], eqbx_error* error, std::string* name) {
     *error = EQBX_NO_ERROR;
     m_event = get_attribute_name(name, false);

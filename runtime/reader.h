@@ -93,6 +93,9 @@ public:
     /// The same with the rows [first, last); an empty range holds no name.
     void get_element_event(const s_event_map* first, const s_event_map* last, eqbx_error* error,
                            std::string* name);
+    /// What `get_element_event` does where the end tag of `name` follows in its plainest form. False, with
+    /// nothing read, otherwise.
+    bool take_end_event(const std::string& name);
     /// The next attribute. False when there is none: the current event is then EQXP_START_TAG_END or
     /// EQXP_END_TAG.
     /// `*error` is always set.

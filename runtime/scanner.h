@@ -55,6 +55,9 @@ public:
     bool get_element_value(std::string* value, eqbx_whitespace mode, bool expand_entities);
     /// Whether the end tag of `name` follows. Consumes it, or what was read of something else.
     bool is_element_end_tag(const std::string& name) { return m_getter.read_end_tag(name); }
+    /// Consumes the end tag of `name` where it follows in its plainest form. False, with nothing read,
+    /// otherwise: `get_element_name` then tells what follows.
+    bool take_end_tag(const std::string& name) { return m_getter.take_end_tag(name); }
     bool skip_start_tag(bool* is_empty) { return m_getter.move_to_start_tag_end(is_empty); }
     /// From behind the start tag of `name` to behind its end tag. Needs memory, but no stack, by depth.
     bool skip_element_body(const std::string& name);

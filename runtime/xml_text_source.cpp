@@ -101,7 +101,6 @@ bool c_get_for_xml::read_end_tag(const std::string& name) {
     return get_non_ws() == '>';
 }
 
-/// The end tag when it can be had at once and has no white space. False, with nothing read, otherwise.
 bool c_get_for_xml::take_end_tag(const std::string& name) {
     s_byte_run run;
     const std::size_t size = name.size();

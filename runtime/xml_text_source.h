@@ -80,10 +80,11 @@ public:
     /// Reads `</name`, white space and `>`, after optional white space. False, with input consumed, for
     /// anything else.
     bool read_end_tag(const std::string& name);
+    /// The same where it can be had at once and has no white space. False, with nothing read, otherwise.
+    bool take_end_tag(const std::string& name);
 
 private:
     int skip_ws_and_get();
-    bool take_end_tag(const std::string& name);
 
     enum class pseudo_value { none, read, bad };
 

@@ -105,6 +105,8 @@ private:
         const bool has_content = !is_at_end();
         if (!is_nil() && !read_body(name, has_content)) return;
         if (is_at_end()) return;  // an empty-element tag has no end tag to check
+        // Nearly always the end tag stands right here, and telling so takes no more than a comparison.
+        if (m_reader.take_end_event(name)) return;
         if (advance(name)) expect_end(name);
     }
 

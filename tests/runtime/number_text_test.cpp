@@ -144,6 +144,36 @@ TEST(TextToDouble, FastAndDefinedWayAgreeOnLongDigitsNearHalfWayPoints) {
     }
 }
 
+TEST(TextToDouble, FastAndDefinedWayAgreeOnDecimalsOfEveryLengthWithThePointAtEveryPlace) {
+    std::mt19937_64 random(6);
+    for (std::size_t length = 1; length <= 21; ++length) {
+        for (int round = 0; round < 40; ++round) {
+            std::string digits;
+            while (digits.size() < length) digits += static_cast<char>('0' + random() % 10);
+            expect_same_as_atof(digits);
+            for (std::size_t place = 0; place <= length; ++place) {
+                std::string text = digits;
+                text.insert(place, 1, '.');
+                expect_same_as_atof(text);
+                expect_same_as_atof("-" + text);
+            }
+        }
+    }
+}
+
+TEST(TextToDouble, FastAndDefinedWayAgreeAroundTheLargestWholeNumberThatADoubleHoldsExactly) {
+    for (std::uint64_t whole = (std::uint64_t{1} << 53) - 20; whole <= (std::uint64_t{1} << 53) + 20;
+         ++whole) {
+        const std::string digits = std::to_string(whole);
+        for (std::size_t place = 0; place <= digits.size(); ++place) {
+            std::string text = digits;
+            text.insert(place, 1, '.');
+            expect_same_as_atof(text);
+            expect_same_as_atof("-" + text);
+        }
+    }
+}
+
 TEST(TextToDouble, FastAndDefinedWayAgreeOnRubbish) {
     const char alphabet[] = "0123456789012345678901234567890.eE+-xXpPaFinfNaN(), \t";
     std::mt19937 random(5);

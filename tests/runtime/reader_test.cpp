@@ -41,6 +41,51 @@ struct Reading {
     bool is_empty = false;
 };
 
+struct Ending {
+    const char* text;
+    bool is_plain;
+};
+void PrintTo(const Ending& e, std::ostream* os) { *os << e.text; }
+
+class EndEvent : public testing::TestWithParam<Ending> {};
+
+TEST_P(EndEvent, IsTakenInItsPlainestFormAndLeavesEverythingAsTheNextEventWould) {
+    const auto at_the_end_of_a_value = [](Reading& r) {
+        ASSERT_EQ(r.element(), 14);
+        while (r.attribute()) r.reader.skip_attribute_value();
+        ASSERT_TRUE(r.reader.get_element_value(&r.value, EQBX_WS_COLLAPSE, true));
+        r.error = EQBX_NO_ERROR;
+    };
+    const std::string document = std::string("<V:one xmlns:V='doc'>1\n2") + GetParam().text;
+    Reading taken(document);
+    Reading awaited(document);
+    at_the_end_of_a_value(taken);
+    at_the_end_of_a_value(awaited);
+    const int before = taken.event();
+
+    EXPECT_EQ(taken.reader.take_end_event("V:one"), GetParam().is_plain);
+    if (!GetParam().is_plain) {
+        EXPECT_EQ(taken.event(), before);
+        taken.element();
+    }
+    awaited.element();
+    for (int events = 0; events < 3; ++events) {
+        EXPECT_EQ(taken.event(), awaited.event());
+        EXPECT_EQ(taken.error, awaited.error);
+        EXPECT_EQ(taken.reader.get_line_no(), awaited.reader.get_line_no());
+        taken.element();
+        awaited.element();
+    }
+}
+
+INSTANTIATE_TEST_SUITE_P(Endings, EndEvent,
+                         testing::Values(Ending{"</V:one>", true}, Ending{"</V:one>\n<V:other/>", true},
+                                         Ending{"</V:one>tail", true}, Ending{"</V:one >", false},
+                                         Ending{"</V:one\n>", false}, Ending{"</V:other>", false},
+                                         Ending{"</V:on>", false}, Ending{"</V:one2>", false},
+                                         Ending{"<V:one/>", false}, Ending{"</V:one", false},
+                                         Ending{"</", false}));
+
 struct Token {
     const char* why;
     const char* document;
