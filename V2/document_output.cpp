@@ -13,7 +13,7 @@
 namespace vrl_v2 {
 namespace {
 
-constexpr std::size_t k_buffer = 64 * 1024;
+constexpr std::size_t k_buffer = 32 * 1024;
 
 }  // namespace
 
