@@ -143,9 +143,9 @@ TEST_P(OurSegmentedArchive, IsUnpackedBy7z) {
 }
 
 TEST_P(OurSegmentedArchive, IsJoinedByZip) {
-    if (IsAes()) return;
+    // Joining takes the entries as they are; it is unzip that knows no AES.
     EXPECT_EQ(RunIn("zip -s 0 a.zip --out whole.zip"), 0);
-    EXPECT_EQ(RunIn("unzip -t -P 'barn red' whole.zip"), 0);
+    EXPECT_EQ(RunIn("unzip -t -P 'barn red' whole.zip"), IsAes() ? 81 : 0);
     ExpectReadable("whole.zip", GetParam().encryption >= 0);
 }
 
