@@ -126,7 +126,8 @@ void check_attributes(const xmlNode* node, const names& known) {
         const auto values = known_values().find(name);
         const std::string value = attribute(node, name.c_str());
         if (values != known_values().end() && values->second.count(value) == 0) {
-            throw schema_error(node, "unknown value '" + value + "' of " + name);
+            throw schema_error(node,
+                               std::string("unknown value '").append(value).append("' of ").append(name));
         }
     }
 }
