@@ -1,12 +1,12 @@
 #include <utility>
 
 #include "V2/archive_source.h"
+#include "V2/block_file.h"
 #include "V2/descriptor_file.h"
 #include "V2/document_file.h"
 #include "V2/file_access.h"
 #include "V2/file_outcome.h"
 #include "V2/reporting_reader.h"
-#include "zip/mem_file.h"
 
 namespace vrl_v2 {
 namespace {
@@ -74,8 +74,7 @@ load_result read_archive(std::string_view bytes, const load_options& options) {
         return failed_load(
             failed(file_failure::limit_exceeded, "an archive of 4 GB and more cannot be read"));
     }
-    // Only read from, and never grown: the block stays what it is.
-    CZipMemFile file(const_cast<char*>(bytes.data()), static_cast<std::uint32_t>(bytes.size()), 0);
+    block_file file(bytes);
     return read_archive(file, options);
 }
 

@@ -71,6 +71,26 @@ TEST(LoadDocument, CanBeToldTheFormat) {
     EXPECT_TRUE(is_the_document(load_document_from_memory(behind_a_stub.Build(), options)));
 }
 
+TEST(LoadDocument, AnArchiveThatPointsBeyondItsEndIsBadFromMemoryAsFromDisk) {
+    const ScratchFolder folder;
+    for (const std::uint32_t offset : {1000U, 0x7FFFFFFFU, 0x80000000U, 0xFFFFFFFFU}) {
+        RawArchive lying_entry = packed(k_text);
+        lying_entry.entries[0].offset = offset;
+        RawArchive lying_directory = packed(k_text);
+        lying_directory.offset = offset;
+        for (const RawArchive& archive : {lying_entry, lying_directory}) {
+            const std::string bytes = archive.Build();
+            folder.Write("a.vrlz", bytes);
+            const load_result from_memory = load_document_from_memory(bytes);
+            const load_result from_disk = load_document(folder / "a.vrlz");
+            EXPECT_EQ(from_memory.failure, file_failure::bad_archive) << offset;
+            EXPECT_EQ(from_disk.failure, file_failure::bad_archive) << offset;
+            EXPECT_TRUE(contains(from_disk.message, from_memory.message)) << from_disk.message << "\n"
+                                                                          << from_memory.message;
+        }
+    }
+}
+
 TEST(LoadDocument, LoadsFromMemoryAndFromStreams) {
     for (const std::string& bytes : {k_text, packed(k_text).Build()}) {
         EXPECT_TRUE(is_the_document(load_document_from_memory(bytes)));
