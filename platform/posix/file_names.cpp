@@ -80,6 +80,7 @@ public:
 
     std::optional<std::string> make_temporary_file(const std::string& folder,
                                                    const std::string& prefix) override {
+        // The six X are what mkstemp puts a name of its own in place of.
         std::string path = folder + "/" + prefix + "XXXXXX";
         const int descriptor = ::mkstemp(path.data());
         if (descriptor < 0) return std::nullopt;

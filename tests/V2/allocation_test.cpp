@@ -8,7 +8,7 @@
 #include <string>
 
 #include "tests/V2/documents.h"
-#include "tests/V2/temporary_folder.h"
+#include "tests/temporary_folder.h"
 
 /// Memory that runs out at every point: what was built is given back, and the failure reaches the caller.
 namespace {

@@ -6,7 +6,7 @@
 #include <type_traits>
 
 #include "tests/V2/documents.h"
-#include "tests/V2/temporary_folder.h"
+#include "tests/temporary_folder.h"
 
 /// Whole documents by path and by text.
 namespace {

@@ -6,8 +6,8 @@
 
 #include "tests/V2/documents.h"
 #include "tests/V2/reading.h"
-#include "tests/V2/temporary_folder.h"
 #include "tests/V2/writing.h"
+#include "tests/temporary_folder.h"
 
 /// What is refused on writing, with 46, and what stands behind the refusal.
 namespace {

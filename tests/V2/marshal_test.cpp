@@ -9,8 +9,8 @@
 
 #include "tests/V2/documents.h"
 #include "tests/V2/reading.h"
-#include "tests/V2/temporary_folder.h"
 #include "tests/V2/writing.h"
+#include "tests/temporary_folder.h"
 
 namespace {
 

@@ -5,7 +5,7 @@
 
 #include "tests/V2/documents.h"
 #include "tests/V2/reading.h"
-#include "tests/V2/temporary_folder.h"
+#include "tests/temporary_folder.h"
 
 /// The way into a document: its outermost element, its namespaces, the overloads.
 namespace {

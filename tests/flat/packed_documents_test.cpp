@@ -1,8 +1,8 @@
 #include <cerrno>
 
 #include "tests/V2/documents.h"
-#include "tests/V2/temporary_folder.h"
 #include "tests/flat/reported_null.h"
+#include "tests/temporary_folder.h"
 #include "zip/exception.h"
 
 /// Packed documents through the C functions: what leaves the members behind them leaves them as well.

@@ -7,10 +7,11 @@
 #include <unistd.h>
 
 #include <cerrno>
-#include <cstdlib>
 #include <fstream>
 #include <iterator>
 #include <set>
+
+#include "tests/temporary_folder.h"
 
 namespace {
 
@@ -22,14 +23,8 @@ using vrl_platform::replacement;
 
 class FileExchange : public testing::Test {
 protected:
-    fs::path folder;
-
-    FileExchange() {
-        std::string name = (fs::temp_directory_path() / "vrl_test_XXXXXX").string();
-        if (::mkdtemp(name.data()) == nullptr) std::abort();
-        folder = name;
-    }
-    ~FileExchange() override { fs::remove_all(folder); }
+    const vrl_test::temporary_folder scratch;
+    const fs::path& folder = scratch.root();
 
     fs::path write(const std::string& name, const std::string& bytes) const {
         std::ofstream(folder / name, std::ios::binary) << bytes;

@@ -27,18 +27,10 @@ const bool k_utc = [] {
 
 ScratchFolder::ScratchFolder() {
     if (!k_utc) throw std::logic_error("time zone");
-    std::string pattern = (fs::temp_directory_path() / "vrl_zip_XXXXXX").string();
-    if (::mkdtemp(pattern.data()) == nullptr) throw std::runtime_error("no scratch folder");
-    m_path = pattern;
-}
-
-ScratchFolder::~ScratchFolder() {
-    std::error_code ignored;
-    fs::remove_all(m_path, ignored);
 }
 
 std::string ScratchFolder::Write(const std::string& name, const Bytes& bytes) const {
-    fs::create_directories((m_path / name).parent_path());
+    fs::create_directories((Path() / name).parent_path());
     WriteFile(*this / name, bytes);
     return *this / name;
 }
@@ -47,7 +39,7 @@ Bytes ScratchFolder::Read(const std::string& name) const { return ReadFile(*this
 
 std::vector<std::string> ScratchFolder::Names() const {
     std::vector<std::string> names;
-    for (const auto& item : fs::directory_iterator(m_path)) names.push_back(item.path().filename().string());
+    for (const auto& item : fs::directory_iterator(Path())) names.push_back(item.path().filename().string());
     std::sort(names.begin(), names.end());
     return names;
 }

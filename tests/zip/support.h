@@ -12,6 +12,7 @@
 #include "platform/file_descriptors.h"
 #include "platform/file_names.h"
 #include "platform/volumes.h"
+#include "tests/temporary_folder.h"
 #include "zip/environment.h"
 #include "zip/exception.h"
 #include "zip/random_pool.h"
@@ -27,18 +28,15 @@ using Bytes = std::string;
 class ScratchFolder {
 public:
     ScratchFolder();
-    ScratchFolder(const ScratchFolder&) = delete;
-    ScratchFolder& operator=(const ScratchFolder&) = delete;
-    ~ScratchFolder();
 
-    std::string operator/(const std::string& name) const { return (m_path / name).string(); }
-    const std::filesystem::path& Path() const { return m_path; }
+    std::string operator/(const std::string& name) const { return m_folder.path(name); }
+    const std::filesystem::path& Path() const { return m_folder.root(); }
     std::string Write(const std::string& name, const Bytes& bytes) const;
     Bytes Read(const std::string& name) const;
     std::vector<std::string> Names() const;
 
 private:
-    std::filesystem::path m_path;
+    vrl_test::temporary_folder m_folder;
 };
 
 /// Makes a folder the current one for as long as this lives.

@@ -14,6 +14,7 @@ namespace vrl_test {
 class temporary_folder {
 public:
     temporary_folder() {
+        // The six X are what mkdtemp puts a name of its own in place of.
         std::string name = (std::filesystem::temp_directory_path() / "vrl_test_XXXXXX").string();
         if (::mkdtemp(name.data()) == nullptr) std::abort();
         m_path = name;
@@ -25,6 +26,7 @@ public:
         std::filesystem::remove_all(m_path, ignored);
     }
 
+    const std::filesystem::path& root() const { return m_path; }
     std::string path(const std::string& name) const { return (m_path / name).string(); }
     std::wstring wide_path(const std::wstring& name) const {
         const std::string folder = m_path.string();  // plain ASCII
